@@ -50,6 +50,9 @@ char32_t DecodeUtf8(std::string_view text, std::size_t& i) {
     int extra = lead >= 0xF0 ? 3 : lead >= 0xE0 ? 2 : lead >= 0xC0 ? 1 : -1;
     if (extra < 0 || lead > 0xF4)
         return kReplacement;
+    // The smallest code point each length may carry; anything below is an overlong form.
+    constexpr char32_t kSmallest[] = {0, 0x80, 0x800, 0x10000};
+    const char32_t smallest = kSmallest[extra];
     char32_t cp = lead & (0x3F >> extra);
     for (; extra > 0; --extra) {
         if (i >= text.size())
@@ -60,7 +63,7 @@ char32_t DecodeUtf8(std::string_view text, std::size_t& i) {
         cp = (cp << 6) | (next & 0x3F);
         ++i;
     }
-    return cp > 0x10FFFF || (cp >= 0xD800 && cp <= 0xDFFF) ? kReplacement : cp;
+    return cp < smallest || cp > 0x10FFFF || (cp >= 0xD800 && cp <= 0xDFFF) ? kReplacement : cp;
 }
 
 } // namespace

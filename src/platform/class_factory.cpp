@@ -158,10 +158,19 @@ HRESULT CLSIDFromProgID(LPCOLESTR progId, CLSID* clsid) {
     return S_OK;
 }
 
+// A factory does not hold the module: a module keeps one factory per class for its whole life, and
+// only LockServer and the objects a factory creates keep the module loaded.
 HRESULT GetClassFactory(const ClassEntry& entry, REFIID riid, void** out) {
-    try {
-        return ComCreator<CClassFactory>::CreateInstance(nullptr, riid, out, entry.create);
-    } catch (const std::bad_alloc&) {
+    if (out == nullptr)
+        return E_POINTER;
+    *out = nullptr;
+    if (entry.create == nullptr)
+        return CLASS_E_CLASSNOTAVAILABLE;
+    auto* factory = new (std::nothrow) CComObjectNoLock<CClassFactory>(entry.create);
+    if (factory == nullptr)
         return E_OUTOFMEMORY;
-    }
+    factory->AddRef();
+    const HRESULT hr = factory->QueryInterface(riid, out);
+    factory->Release();
+    return hr;
 }

@@ -12,7 +12,7 @@ namespace dispatch_detail {
 template <class I> void* PointerFor(I* object, const InterfaceDescription* owner) {
     if (owner == &I::Description())
         return object;
-    if constexpr (requires { I::BaseInterface::Description(); })
+    if constexpr (requires { I::BaseInterface::template Description<>(); })
         return PointerFor<typename I::BaseInterface>(object, owner);
     else
         return nullptr;

@@ -60,4 +60,17 @@ IUnknown* ObjectOf(const VARIANT& v) {
     return v.vt == VT_DISPATCH ? static_cast<IUnknown*>(v.pdispVal) : v.punkVal;
 }
 
+HRESULT Argument<GUID>::Load(const VARIANT& v) {
+    if (v.vt != VT_BSTR) return DISP_E_TYPEMISMATCH;
+    const auto parsed = GuidFromString(Utf16ToUtf8(BstrView(v.bstrVal)));
+    if (!parsed) return DISP_E_TYPEMISMATCH;
+    value = *parsed;
+    return S_OK;
+}
+
+void Result<GUID>::Store(VARIANT* out) {
+    out->vt = VT_BSTR;
+    out->bstrVal = CComBSTR(GuidToString(value)).Detach();
+}
+
 } // namespace dispatch_detail

@@ -72,7 +72,6 @@ template <VARTYPE V> struct Simple {
 };
 
 template <> struct AutomationType<double> : Simple<VT_R8> {};
-template <> struct AutomationType<float> : Simple<VT_R4> {};
 template <> struct AutomationType<std::int32_t> : Simple<VT_I4> {};
 template <> struct AutomationType<std::uint32_t> : Simple<VT_UI4> {};
 template <> struct AutomationType<std::int16_t> : Simple<VT_I2> {};
@@ -81,6 +80,8 @@ template <> struct AutomationType<std::uint8_t> : Simple<VT_UI1> {};
 template <> struct AutomationType<VARIANT_BOOL> : Simple<VT_BOOL> {};
 template <> struct AutomationType<BSTR> : Simple<VT_BSTR> {};
 template <> struct AutomationType<VARIANT> : Simple<VT_VARIANT> {};
+// Identifiers cross automation as their registry form, "{D62B8AB1-6877-4F6D-B8CD-EECEA2E937E1}".
+template <> struct AutomationType<GUID> : Simple<VT_BSTR> {};
 
 template <class E>
 requires std::is_enum_v<E> &&(!std::is_same_v<E, VARIANT_BOOL>)struct AutomationType<E> : Simple<VT_I4> {
@@ -181,6 +182,12 @@ template <> struct Argument<BSTR> {
     BSTR Get() const { return value; }
 };
 
+template <> struct Argument<GUID> {
+    GUID value{};
+    HRESULT Load(const VARIANT& v);
+    GUID Get() const { return value; }
+};
+
 template <> struct Argument<VARIANT> {
     VARIANT value{};
     HRESULT Load(const VARIANT& v) {
@@ -212,8 +219,6 @@ template <class T> struct Result {
         out->vt = AutomationType<T>::vt;
         if constexpr (std::is_same_v<T, double>)
             out->dblVal = value;
-        else if constexpr (std::is_same_v<T, float>)
-            out->fltVal = value;
         else if constexpr (std::is_same_v<T, VARIANT_BOOL>)
             out->boolVal = value;
         else if constexpr (std::is_enum_v<T>)
@@ -238,6 +243,12 @@ template <> struct Result<BSTR> {
         out->vt = VT_BSTR;
         out->bstrVal = value.Detach();
     }
+};
+
+template <> struct Result<GUID> {
+    GUID value{};
+    GUID* Address() { return &value; }
+    void Store(VARIANT* out);
 };
 
 template <> struct Result<VARIANT> {
@@ -342,33 +353,32 @@ template <class Base> constexpr auto BaseDescriptionOf() -> const InterfaceDescr
 #define BW_DECLARE_METHOD(Name, Params) virtual HRESULT Name Params = 0;
 #define BW_DECLARE_MEMBER(kind, ...) BW_DECLARE_##kind(__VA_ARGS__)
 
-#define BW_DESCRIBE_PROP(Type, Name)                                                                         \
-    ::dispatch_detail::Describe<&Self::get_##Name>(#Name, MemberKind::PropertyGet),                          \
-        ::dispatch_detail::Describe<&Self::put_##Name>(#Name, MemberKind::PropertyPut),
-#define BW_DESCRIBE_GET(Type, Name)                                                                          \
-    ::dispatch_detail::Describe<&Self::get_##Name>(#Name, MemberKind::PropertyGet),
-#define BW_DESCRIBE_PUT(Type, Name)                                                                          \
-    ::dispatch_detail::Describe<&Self::put_##Name>(#Name, MemberKind::PropertyPut),
-#define BW_DESCRIBE_METHOD(Name, Params) ::dispatch_detail::Describe<&Self::Name>(#Name, MemberKind::Method),
+#define BW_DESCRIBE_PROP(Type, Name)                                                                                \
+    ::dispatch_detail::Describe<&Me::get_##Name>(#Name, MemberKind::PropertyGet),                                    \
+        ::dispatch_detail::Describe<&Me::put_##Name>(#Name, MemberKind::PropertyPut),
+#define BW_DESCRIBE_GET(Type, Name) ::dispatch_detail::Describe<&Me::get_##Name>(#Name, MemberKind::PropertyGet),
+#define BW_DESCRIBE_PUT(Type, Name) ::dispatch_detail::Describe<&Me::put_##Name>(#Name, MemberKind::PropertyPut),
+#define BW_DESCRIBE_METHOD(Name, Params) ::dispatch_detail::Describe<&Me::Name>(#Name, MemberKind::Method),
 #define BW_DESCRIBE_MEMBER(kind, ...) BW_DESCRIBE_##kind(__VA_ARGS__)
 
 // Declares interface Name on Base with the identifier IID_Name and the members of the list macro.
 // An interface on IDispatch is dual: it answers automation calls by name through IDispatchImpl.
-#define BW_INTERFACE(Name, Base, MEMBERS)                                                                    \
-    struct Name : Base {                                                                                     \
-        using BaseInterface = Base;                                                                          \
-        using Self = Name;                                                                                   \
-        static constexpr IID iid = IID_##Name;                                                               \
-        MEMBERS(BW_DECLARE_MEMBER)                                                                           \
-        static const InterfaceDescription& Description() {                                                   \
-            static constexpr MemberDescription members[] = {MEMBERS(BW_DESCRIBE_MEMBER)                      \
-                                                                MemberDescription{}};                        \
-            static constexpr InterfaceDescription description{                                               \
-                #Name, &iid, ::dispatch_detail::BaseDescriptionOf<Base>(),                                   \
-                std::span<const MemberDescription>(members, std::size(members) - 1)};                        \
-            return description;                                                                              \
-        }                                                                                                    \
-                                                                                                             \
-      protected:                                                                                             \
-        ~Name() = default;                                                                                   \
+// The description is built on first use (a template), so interfaces may name each other in their
+// parameters before all of them are complete.
+#define BW_INTERFACE(Name, Base, MEMBERS)                                                                          \
+    struct Name : Base {                                                                                             \
+        using BaseInterface = Base;                                                                                  \
+        static constexpr IID iid = IID_##Name;                                                                       \
+        MEMBERS(BW_DECLARE_MEMBER)                                                                                   \
+        template <class Me = Name>                                                                                   \
+        static const InterfaceDescription& Description() {                                                          \
+            static constexpr MemberDescription members[] = {MEMBERS(BW_DESCRIBE_MEMBER) MemberDescription{}};        \
+            static constexpr InterfaceDescription description{                                                      \
+                #Name, &Me::iid, ::dispatch_detail::BaseDescriptionOf<Base>(),                                       \
+                std::span<const MemberDescription>(members, std::size(members) - 1)};                                \
+            return description;                                                                                      \
+        }                                                                                                            \
+                                                                                                                     \
+    protected:                                                                                                       \
+        ~Name() = default;                                                                                           \
     }

@@ -88,6 +88,13 @@ CComVariant::CComVariant(std::u16string_view text) {
     bstrVal = CComBSTR(text).Detach();
 }
 
+CComVariant::CComVariant(const OLECHAR* text) {
+    VariantInit(this);
+    vt = VT_BSTR;
+    if (text != nullptr)
+        bstrVal = CComBSTR(std::u16string_view(text)).Detach();
+}
+
 CComVariant::CComVariant(IUnknown* object) {
     VariantInit(this);
     vt = VT_UNKNOWN;

@@ -70,6 +70,9 @@ class CComVariant : public VARIANT {
     CComVariant(std::int32_t value);
     CComVariant(bool value);
     CComVariant(std::u16string_view text);
+    // A string literal or BSTR is a string (a null one the empty string), never a boolean.
+    CComVariant(const OLECHAR* text);
+    CComVariant(const char* text) = delete;
     CComVariant(IUnknown* object);
     CComVariant(IDispatch* object);
     ~CComVariant() { VariantClear(this); }

@@ -1,0 +1,1 @@
+bw_fuzz_target(scan_device_config scan_device_config_fuzz.cpp LIBS bw_core)
