@@ -1,1 +1,2 @@
 bw_fuzz_target(scan_device_config scan_device_config_fuzz.cpp LIBS bw_core)
+bw_fuzz_target(job_file job_file_fuzz.cpp LIBS bw_tool_lib bw_beamweaver)

@@ -4,6 +4,8 @@
 #include "core/rendering_classes.h"
 #include "dwellmap/dwellmap_registration.h"
 #include "platform/module_lock.h"
+
+#include <mutex>
 #include "shapes/shape_classes.h"
 
 namespace Norvane::Lumis::Scanning {
@@ -39,8 +41,20 @@ HRESULT DllCanUnloadNow() { return ModuleLockCount() == 0 ? S_OK : S_FALSE; }
 HRESULT DllGetClassObject(REFCLSID clsid, REFIID riid, void** out) {
     if (out == nullptr) return E_POINTER;
     *out = nullptr;
-    for (const ClassEntry& entry : BeamweaverClassTable())
-        if (entry.clsid == clsid) return GetClassFactory(entry, riid, out);
+    // One factory per class, made on first request and kept for the life of the module; factories do
+    // not hold the module, so a client keeping one does not keep the module loaded.
+    static std::mutex mutex;
+    static std::vector<CComPtr<IUnknown>> factories(BeamweaverClassTable().size());
+    const auto& table = BeamweaverClassTable();
+    for (std::size_t i = 0; i < table.size(); ++i) {
+        if (!(table[i].clsid == clsid)) continue;
+        std::lock_guard lock(mutex);
+        if (!factories[i]) {
+            const HRESULT hr = GetClassFactory(table[i], IUnknown::iid, reinterpret_cast<void**>(&factories[i]));
+            if (FAILED(hr)) return hr;
+        }
+        return factories[i]->QueryInterface(riid, out);
+    }
     return CLASS_E_CLASSNOTAVAILABLE;
 }
 

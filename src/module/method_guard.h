@@ -10,10 +10,12 @@
 //     }
 //
 // A body returns an HRESULT, or nothing for S_OK. The overloads with an out pointer return E_POINTER
-// for a null one before anything else, without error information.
+// for a null one before anything else, without error information. Every call starts with the thread's
+// error information empty, so a failure without a message reads as just that.
 #pragma once
 
 #include "module/error_reporting.h"
+#include "platform/error_info.h"
 
 #include <boost/thread/lock_types.hpp>
 #include <boost/thread/recursive_mutex.hpp>
@@ -27,6 +29,10 @@ using ObjectMutex = boost::recursive_mutex;
 
 namespace guard_detail {
 
+// Empties the thread's error information: a method that then fails without a message must not leave an
+// earlier, unrelated description for its caller's call check to pick up.
+inline void ClearThreadErrorInfo() { SetErrorInfo(0, nullptr); }
+
 template <class Body> HRESULT RunBody(Body& body) {
     if constexpr (std::is_void_v<std::invoke_result_t<Body&>>) {
         body();
@@ -39,6 +45,7 @@ template <class Body> HRESULT RunBody(Body& body) {
 } // namespace guard_detail
 
 template <class Body> HRESULT Guarded(REFIID riid, Body&& body) {
+    guard_detail::ClearThreadErrorInfo();
     try {
         return guard_detail::RunBody(body);
     } catch (...) {
@@ -47,6 +54,7 @@ template <class Body> HRESULT Guarded(REFIID riid, Body&& body) {
 }
 
 template <class Body> HRESULT Guarded(REFIID riid, ObjectMutex& mutex, Body&& body) {
+    guard_detail::ClearThreadErrorInfo();
     try {
         boost::unique_lock<ObjectMutex> lock(mutex);
         return guard_detail::RunBody(body);
@@ -56,14 +64,18 @@ template <class Body> HRESULT Guarded(REFIID riid, ObjectMutex& mutex, Body&& bo
 }
 
 template <class Out, class Body> HRESULT Guarded(REFIID riid, Out* out, Body&& body) {
-    if (out == nullptr)
+    if (out == nullptr) {
+        guard_detail::ClearThreadErrorInfo();
         return E_POINTER;
+    }
     return Guarded(riid, std::forward<Body>(body));
 }
 
 template <class Out, class Body> HRESULT Guarded(REFIID riid, ObjectMutex& mutex, Out* out, Body&& body) {
-    if (out == nullptr)
+    if (out == nullptr) {
+        guard_detail::ClearThreadErrorInfo();
         return E_POINTER;
+    }
     return Guarded(riid, mutex, std::forward<Body>(body));
 }
 

@@ -48,7 +48,7 @@ std::uint64_t UnsignedOf(const VARIANT& v) {
 }
 
 double FloatingOf(const VARIANT& v) {
-    return v.vt == VT_R4 ? double{v.fltVal} : v.dblVal;
+    return v.vt == VT_R4 ? static_cast<double>(v.fltVal) : v.dblVal;
 }
 
 bool IsNullObject(const VARIANT& v) {
