@@ -17,7 +17,8 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
     static const bool registered = (RegisterComponents(), true);
     (void)registered;
     try {
-        const Tool::Json job = Tool::ParseJob(std::string_view(reinterpret_cast<const char*>(data), size), "fuzz");
+        const Tool::Json job =
+            Tool::ParseJob(std::string_view(reinterpret_cast<const char*>(data), size), "fuzz");
         if (job.value("class", Tool::Json()) == "PatternLine")
             Tool::ApplyJob(job);
     } catch (const Tool::ToolError&) {

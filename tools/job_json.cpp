@@ -73,7 +73,8 @@ Json ParseJob(std::string_view text, const std::string& source) {
     try {
         DuplicateKeyCheck check(source);
         job = Json::parse(text.begin(), text.end(), std::ref(check));
-    } catch (const Json::parse_error& error) {
+    } catch (const Json::exception& error) {
+        // A parse error, or a number too large for a double ("1e400"), which the parser reports apart.
         throw ToolError(source + ": malformed JSON: " + WithoutExceptionName(error.what()));
     }
     if (!job.is_object())

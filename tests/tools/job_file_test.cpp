@@ -189,6 +189,9 @@ INSTANTIATE_TEST_SUITE_P(
     ::testing::Values(
         MalformedJob{R"({"class": "PatternLine",)", "job.json: malformed JSON: parse error at line 1"},
         MalformedJob{"", "job.json: malformed JSON: parse error at line 1"},
+        // Too large for a double: the parser reports it apart from syntax errors.
+        MalformedJob{R"({"class": "PatternLine", "Pitch": 1e400})",
+                     "job.json: malformed JSON: number overflow parsing '1e400'"},
         MalformedJob{R"([{"class": "PatternLine"}])",
                      "job.json: malformed job: a job is one JSON object with a \"class\" key"},
         MalformedJob{R"({"class": "PatternLine", "RenderingProperties": {"PreBlankingTime": 1,

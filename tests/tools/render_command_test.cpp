@@ -192,8 +192,8 @@ INSTANTIATE_TEST_SUITE_P(
         BadInput{R"({"class": "PatternLine", "Pitch": 0})", "Pitch: value refused (0x80070057)\n"},
         BadInput{R"({"class": "CoordinateFloat", "X": 0.5})", "class: CoordinateFloat is not a pattern\n"}));
 
-// A failure while writing the outputs (here the stream export of a point beyond the DAC range is not
-// reachable from a line, so an unwritable preview path stands in) must not leave the other outputs.
+// The CSV and the stream are complete before the preview fails (its directory is missing); neither may
+// appear.
 TEST_F(RenderCommandTest, AnOutputThatCannotBeWrittenLeavesNoneOfTheOthers) {
     RenderOptions options = WithEveryOutput(SmallLineJob());
     options.previewPath = (directory / "missing" / "dose.png").string();
