@@ -23,10 +23,8 @@ void ReadValidation(IPattern& pattern, RenderReport& report) {
 std::optional<DacRectangle> ReadDacBoundingBox(IPattern& pattern) {
     CComPtr<IRectangleInt> box;
     const HRESULT hr = pattern.GetDacBoundingBox(&box);
-    if (hr == E_NOTIMPL) {
-        TakeErrorText();
+    if (hr == E_NOTIMPL)
         return std::nullopt;
-    }
     CheckCall(hr, "GetDacBoundingBox");
     return ReadRectangle(*box, "GetDacBoundingBox");
 }
