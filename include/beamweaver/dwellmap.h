@@ -67,6 +67,18 @@ enum ScanDirection : std::int32_t {
     ScanDirection_Reverse = 1,
 };
 
+// Which axis a line runs along: horizontal lines are stepped in Y, vertical lines in X.
+enum ScanOrientation : std::int32_t {
+    ScanOrientation_Horizontal = 0,
+    ScanOrientation_Vertical = 1,
+};
+
+// Raster: every line runs in the line direction; serpentine: consecutive lines alternate.
+enum ScanType : std::int32_t {
+    ScanType_Raster = 0,
+    ScanType_Serpentine = 1,
+};
+
 // Direct access to the contiguous records of a point list. Not automation-compatible: it hands out
 // memory. Every range it gives stays valid, and is the list's own storage, until the buffer is released.
 struct IPatternPointBuffer : IUnknown {

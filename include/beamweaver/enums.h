@@ -14,3 +14,13 @@ enum MultiPass : std::int32_t {
     MultiPass_OneOrientation = 1,
     MultiPass_AllOrientations = 2,
 };
+
+enum FillStyle : std::int32_t {
+    FillStyle_Solid = 0,
+    FillStyle_Frame = 1,
+};
+
+enum CircleScanType : std::int32_t {
+    CircleScanType_InnerToOuter = 0,
+    CircleScanType_OuterToInner = 1,
+};

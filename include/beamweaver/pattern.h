@@ -4,6 +4,7 @@
 #include <beamweaver/comtypes.h>
 #include <beamweaver/dwellmap.h>
 #include <beamweaver/enums.h>
+#include <beamweaver/exclusion.h>
 #include <beamweaver/identifiers.h>
 #include <beamweaver/rendering.h>
 #include <beamweaver/scan_definition.h>
@@ -71,10 +72,6 @@ BW_INTERFACE(ICloneablePattern, IUnknown, ICloneablePattern_MEMBERS);
     X(METHOD, FilterList, (IPatternPointList * list))                                                                \
     X(METHOD, FilterListWithOffset, (IPatternPointList * list, std::uint16_t offsetX, std::uint16_t offsetY))
 BW_INTERFACE(IPatternPointFilter, IUnknown, IPatternPointFilter_MEMBERS);
-
-// A set of shapes whose area is cut out of renderings. Its shape members come with the shapes.
-#define IExclusionZone_MEMBERS(X)
-BW_INTERFACE(IExclusionZone, IDispatch, IExclusionZone_MEMBERS);
 
 #define IExclusionAwarePattern_MEMBERS(X)                                                                            \
     X(METHOD, RenderWithExclusion, (IPatternPointFilter * filter, IScanDefinition * *scanDefinition))                \

@@ -6,6 +6,7 @@
 #include <beamweaver/enums.h>
 #include <beamweaver/identifiers.h>
 #include <beamweaver/pattern.h>
+#include <beamweaver/strategies.h>
 
 // A straight row of equally spaced points from Begin to End (relative coordinates), with a dwell time
 // running linearly from BeginDwellTime to EndDwellTime (seconds). Pitch is the spacing in relative units;
@@ -22,3 +23,15 @@
     X(PROP, MultiPass, MultiPass)                                                                            \
     X(METHOD, GetEffectiveLoopTime, (double* loopTime))
 BW_INTERFACE(IPatternLine, IPatternShape, IPatternLine_MEMBERS);
+
+// A rectangle (relative coordinates) milled line by line or as its outline under a rectangular scan
+// strategy, with a dwell ramping from BeginDwellTime on the first line to EndDwellTime on the last.
+// GetEffectiveLoopTime is the time of one pass without blanking.
+#define IPatternRectangle_MEMBERS(X)                                                                         \
+    X(PROP, IRectangleFloat*, Rectangle)                                                                     \
+    X(PROP, double, BeginDwellTime)                                                                          \
+    X(PROP, double, EndDwellTime)                                                                            \
+    X(PROP, IScanStrategyRectangular*, ScanStrategy)                                                         \
+    X(PROP, ITransformationMatrix2D*, TransformationMatrix)                                                  \
+    X(METHOD, GetEffectiveLoopTime, (double* loopTime))
+BW_INTERFACE(IPatternRectangle, IPatternShape, IPatternRectangle_MEMBERS);

@@ -1,0 +1,33 @@
+// The exclusion filter: removes the exposing points that fall inside one shape from a point list, in
+// place and in one pass, and keeps the blanking lead-in and lead-out consistent around what is left.
+#pragma once
+
+#include "module/geometry_values.h"
+#include "platform/com_ptr.h"
+
+#include <beamweaver/dwellmap.h>
+
+#include <cstdint>
+#include <functional>
+#include <span>
+
+namespace Norvane::Lumis::Scanning {
+
+// What one filter pass needs of a shape: its transformation matrix (shape to field; the filter maps
+// points through its inverse), its DAC ranges, and whether it contains a relative position.
+struct ShapeView {
+    TransformationMatrix matrix;
+    RangeInt rangeX{0, 65535};
+    RangeInt rangeY{0, 65535};
+    const std::function<bool(coordinate<double>)>* contains = nullptr;
+};
+
+// Compacts points in place; returns how many were kept (the first ones). Offsets are added to each
+// point's stored position for the containment test only.
+std::uint32_t FilterPoints(std::span<PatternPoint> points, std::uint16_t offsetX, std::uint16_t offsetY,
+                           const ShapeView& shape);
+
+// The same on a point list, shortened afterwards; a null list fails with "Null arguments supplied".
+void FilterPointList(IPatternPointList* list, std::uint16_t offsetX, std::uint16_t offsetY, const ShapeView& shape);
+
+} // namespace Norvane::Lumis::Scanning
