@@ -91,6 +91,8 @@ function(bw_test name)
   bw_configure_target(test_${name})
   target_link_libraries(test_${name} PRIVATE ${arg_LIBS} GTest::gmock GTest::gtest_main Threads::Threads)
   target_compile_definitions(test_${name} PRIVATE "BW_SOURCE_DIR=\"${CMAKE_SOURCE_DIR}\"")
+  # Helpers shared by several suites live in tests/common.
+  target_include_directories(test_${name} PRIVATE ${CMAKE_SOURCE_DIR}/tests)
 
   set(properties "")
   if(arg_THREADS)

@@ -7,6 +7,8 @@
 #include "platform/dispatch.h"
 #include "platform/error_info.h"
 
+#include "common/error_info_probe.h"
+
 #include <gtest/gtest.h>
 
 #include <cmath>
@@ -23,23 +25,10 @@ using namespace Norvane::Lumis::Scanning;
 
 constexpr double kNaN = std::numeric_limits<double>::quiet_NaN();
 
-struct ErrorReport {
-    GUID guid{};
-    std::u16string description;
-};
+using Norvane::testing::TakePublishedErrorInfo;
 
-// Takes the thread's error information out of its slot.
-std::optional<ErrorReport> TakeErrorReport() {
-    CComPtr<IErrorInfo> info;
-    if (GetErrorInfo(0, &info) != S_OK)
-        return std::nullopt;
-    ErrorReport report;
-    CComBSTR description;
-    info->GetGUID(&report.guid);
-    info->GetDescription(&description);
-    report.description = description.View();
-    return report;
-}
+// Takes the thread's error information out of its slot; nothing when there is none.
+auto TakeErrorReport() { return TakePublishedErrorInfo(); }
 
 void ClearErrorReport() {
     SetErrorInfo(0, nullptr);

@@ -1,4 +1,4 @@
-#include "error_info_probe.h"
+#include "common/error_info_probe.h"
 #include "module/byte_text.h"
 #include "module/error_reporting.h"
 #include "module/win32_error.h"

@@ -1,4 +1,4 @@
-#include "error_info_probe.h"
+#include "common/error_info_probe.h"
 #include "module/method_guard.h"
 
 #include <beamweaver/identifiers.h>

@@ -8,6 +8,8 @@
 #include "module/create_instance.h"
 #include "module/geometry_io.h"
 
+#include "common/error_info_probe.h"
+
 #include <gtest/gtest.h>
 
 #include <cmath>
@@ -22,23 +24,10 @@ namespace {
 constexpr double kNaN = std::numeric_limits<double>::quiet_NaN();
 constexpr double kInfinity = std::numeric_limits<double>::infinity();
 
-struct ErrorReport {
-    GUID guid{};
-    std::u16string description;
-};
+using Norvane::testing::TakePublishedErrorInfo;
 
 // Takes the thread's error information out of its slot; nothing when there is none.
-std::optional<ErrorReport> TakeErrorReport() {
-    CComPtr<IErrorInfo> info;
-    if (GetErrorInfo(0, &info) != S_OK)
-        return std::nullopt;
-    ErrorReport report;
-    CComBSTR description;
-    info->GetGUID(&report.guid);
-    info->GetDescription(&description);
-    report.description = description.View();
-    return report;
-}
+auto TakeErrorReport() { return TakePublishedErrorInfo(); }
 
 void ExpectError(REFIID iid, const std::u16string& description) {
     const auto report = TakeErrorReport();
