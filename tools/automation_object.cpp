@@ -1,6 +1,11 @@
 #include "tools/automation_object.h"
 
+#include "platform/dispatch_impl.h"
+
+#include <algorithm>
 #include "tools/tool_error.h"
+
+#include <beamweaver/pattern.h>
 
 namespace Norvane::Lumis::Scanning::Tool {
 
@@ -15,6 +20,18 @@ const InterfaceDescription& DescriptionOf(IDispatch* dispatch, const std::string
     return *description;
 }
 
+// Interfaces of the library that are not automation interfaces but carry members a job may use.
+struct PlainInterface {
+    const IID* iid;
+    const InterfaceDescription& (*describe)();
+};
+
+const PlainInterface kPlainInterfaces[] = {
+    {&IExclusionAwarePattern::iid, &IExclusionAwarePattern::Description<>},
+    {&IExcludablePatternShape::iid, &IExcludablePatternShape::Description<>},
+    {&ICloneablePattern::iid, &ICloneablePattern::Description<>},
+};
+
 } // namespace
 
 AutomationObject::AutomationObject(IUnknown* object, const std::string& path)
@@ -24,6 +41,20 @@ AutomationObject::AutomationObject(IUnknown* object, const std::string& path)
     const InterfaceDescription& description = DescriptionOf(dispatch_, path);
     interfaceName_ = description.name;
     members_ = FlattenMembers(description);
+    AddPlainInterfaces(object);
+}
+
+void AutomationObject::AddPlainInterfaces(IUnknown* object) {
+    for (const PlainInterface& plain : kPlainInterfaces) {
+        CComPtr<IUnknown> target;
+        if (FAILED(object->QueryInterface(*plain.iid, reinterpret_cast<void**>(&target))))
+            continue;
+        for (DispatchMember member : FlattenMembers(plain.describe())) {
+            member.id = static_cast<DISPID>(members_.size() + 1);
+            members_.push_back(member);
+            plainTargets_.emplace_back(member.id, target);
+        }
+    }
 }
 
 const DispatchMember* AutomationObject::Find(std::string_view name) const {
@@ -61,8 +92,17 @@ CallOutcome AutomationObject::Invoke(const DispatchMember& member, WORD flags, D
     constexpr IID reserved{};
     EXCEPINFO exception{};
     UINT argumentError = 0;
-    const HRESULT hr =
-        dispatch_->Invoke(member.id, reserved, 0, flags, params, result, &exception, &argumentError);
+    HRESULT hr = S_OK;
+    const auto plain = std::find_if(plainTargets_.begin(), plainTargets_.end(),
+                                    [&](const auto& entry) { return entry.first == member.id; });
+    if (plain == plainTargets_.end()) {
+        hr = dispatch_->Invoke(member.id, reserved, 0, flags, params, result, &exception, &argumentError);
+    } else {
+        const MemberDescription* form = SelectForm(member, flags);
+        hr = form ? dispatch_detail::InvokeMember(plain->second.Get(), *form, params, result, &exception,
+                                                  &argumentError)
+                  : DISP_E_MEMBERNOTFOUND;
+    }
     if (hr != DISP_E_EXCEPTION)
         return {hr, {}, false};
     CallOutcome outcome{exception.scode, CComBSTR::Copy(exception.bstrDescription).Utf8(), true};

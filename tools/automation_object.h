@@ -1,10 +1,12 @@
 // One object as a job file sees it: its automation interface and the members of that interface's chain,
-// called by name.
+// called by name, plus the members of the library's plain (non-automation) pattern interfaces that the
+// object answers — exclusion, exclusion shape, cloning — called through their member tables.
 #pragma once
 
 #include "platform/dispatch_members.h"
 
 #include <string>
+#include <utility>
 #include <string_view>
 #include <vector>
 
@@ -42,9 +44,13 @@ class AutomationObject {
   private:
     CallOutcome Invoke(const DispatchMember& member, WORD flags, DISPPARAMS* params, VARIANT* result) const;
 
+    void AddPlainInterfaces(IUnknown* object);
+
     CComPtr<IDispatch> dispatch_;
     const char* interfaceName_ = "";
     std::vector<DispatchMember> members_;
+    // For members of plain interfaces: the interface pointer to call them on, by dispatch identifier.
+    std::vector<std::pair<DISPID, CComPtr<IUnknown>>> plainTargets_;
 };
 
 } // namespace Norvane::Lumis::Scanning::Tool

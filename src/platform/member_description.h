@@ -283,14 +283,13 @@ template <class C, class... Ps> struct Signature<HRESULT (C::*)(Ps...)> {
     using Class = C;
     using Params = std::tuple<Ps...>;
     static constexpr std::size_t count = sizeof...(Ps);
-    static constexpr bool hasResult = count > 0 && IsResultParameter<std::tuple_element_t<count - 1, Params>>;
+    // The last parameter, or void* standing in for it when there is none (void* is never a result).
+    using Last = std::tuple_element_t<(count > 0 ? count - 1 : 0), std::tuple<Ps..., void*>>;
+    static constexpr bool hasResult = IsResultParameter<Last>;
     static constexpr std::size_t inputs = hasResult ? count - 1 : count;
 
     template <std::size_t I> using Input = std::tuple_element_t<I, Params>;
-    using ResultType = std::conditional_t<
-        hasResult,
-        std::remove_pointer_t<std::tuple_element_t<(count > 0 ? count - 1 : 0), std::tuple<Ps..., void*>>>,
-        void>;
+    using ResultType = std::conditional_t<hasResult, std::remove_pointer_t<Last>, void>;
 };
 
 template <auto Fn, std::size_t... I> constexpr auto InputTypes(std::index_sequence<I...>) {
