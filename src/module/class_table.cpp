@@ -2,6 +2,7 @@
 
 #include "comtypes/comtypes_registration.h"
 #include "core/rendering_classes.h"
+#include "core/strategy_classes.h"
 #include "dwellmap/dwellmap_registration.h"
 #include "platform/module_lock.h"
 
@@ -14,7 +15,7 @@ namespace {
 
 std::vector<ClassEntry> BuildClassTable() {
     std::vector<ClassEntry> table;
-    for (auto part : {RenderingClassEntries(), ShapeClassEntries()})
+    for (auto part : {RenderingClassEntries(), StrategyClassEntries(), ShapeClassEntries()})
         table.insert(table.end(), part.begin(), part.end());
     return table;
 }
