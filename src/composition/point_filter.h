@@ -23,11 +23,15 @@ struct ShapeView {
 };
 
 // Compacts points in place; returns how many were kept (the first ones). Offsets are added to each
-// point's stored position for the containment test only.
+// point's stored position for the containment test only. The lead-in regenerated in front of a kept
+// point takes only the room of the points dropped before it, so a pass never writes over a point it has
+// not read yet and never keeps more points than it was given. The inverse matrix is computed on the
+// first exposing point: a singular matrix fails only a pass that has one. shape.contains must be set.
 std::uint32_t FilterPoints(std::span<PatternPoint> points, std::uint16_t offsetX, std::uint16_t offsetY,
                            const ShapeView& shape);
 
 // The same on a point list, shortened afterwards; a null list fails with "Null arguments supplied".
-void FilterPointList(IPatternPointList* list, std::uint16_t offsetX, std::uint16_t offsetY, const ShapeView& shape);
+void FilterPointList(IPatternPointList* list, std::uint16_t offsetX, std::uint16_t offsetY,
+                     const ShapeView& shape);
 
 } // namespace Norvane::Lumis::Scanning

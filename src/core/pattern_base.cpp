@@ -21,6 +21,33 @@ double Span(const PatternAlignment& alignment) {
     return static_cast<double>(alignment.range.maximum) - static_cast<double>(alignment.range.minimum);
 }
 
+// The matrix about a center applied to DAC positions: DacToRelative, the affine map, RelativeToDac, with
+// the same operations in the same order as those functions, and the axis constants read once.
+class DacAffineMap {
+  public:
+    DacAffineMap(const PatternRenderingSettings& settings, const TransformationMatrix& matrix,
+                 coordinate<double> center)
+        : minX_(settings.alignmentX.range.minimum), spanX_(Span(settings.alignmentX)),
+          minY_(settings.alignmentY.range.minimum), spanY_(Span(settings.alignmentY)), m_(matrix),
+          center_(center) {}
+
+    // The mapped DAC position before truncation.
+    coordinate<double> Apply(double x, double y) const {
+        const double dx = (x - minX_) / spanX_ - center_.x;
+        const double dy = (y - minY_) / spanY_ - center_.y;
+        return {minX_ + spanX_ * (center_.x + (m_.m0 * dx + m_.m1 * dy + m_.m2)),
+                minY_ + spanY_ * (center_.y + (m_.m3 * dx + m_.m4 * dy + m_.m5))};
+    }
+
+  private:
+    double minX_;
+    double spanX_;
+    double minY_;
+    double spanY_;
+    TransformationMatrix m_;
+    coordinate<double> center_;
+};
+
 } // namespace
 
 std::uint16_t ClampToDac(double value) {
@@ -191,23 +218,26 @@ bool CPattern::HasTransformation() const {
              std::abs(m.m3) < tolerance && std::abs(m.m4 - 1.0) < tolerance && std::abs(m.m5) < tolerance);
 }
 
-DacPosition CPattern::TransformOne(coordinate<double> center, DacPosition position) const {
-    const auto& m = matrix_;
-    const coordinate<double> relative = DacToRelative(position.x, position.y);
-    const double dx = relative.x - center.x;
-    const double dy = relative.y - center.y;
-    return RelativeToDac(center.x + (m.m0 * dx + m.m1 * dy + m.m2),
-                         center.y + (m.m3 * dx + m.m4 * dy + m.m5));
-}
-
+// Without offsets, truncating to 32 bits and then clamping to the DAC range gives exactly what clamping
+// the mapped value does (both truncate toward zero, both give 0 for NaN), so that common case skips the
+// intermediate integer.
 void CPattern::TransformPoints(coordinate<double> center, std::span<PatternPoint> points,
                                DacPosition offset) const {
     if (!HasTransformation())
         return;
+    const DacAffineMap map(settings_, matrix_, center);
+    if (offset == DacPosition{}) {
+        for (PatternPoint& point : points) {
+            const coordinate<double> moved = map.Apply(point.x, point.y);
+            point = MakePoint(ClampToDac(moved.x), ClampToDac(moved.y), point.dwell, point.flags);
+        }
+        return;
+    }
     for (PatternPoint& point : points) {
-        const DacPosition moved = TransformOne(center, {point.x + offset.x, point.y + offset.y});
-        point = MakePoint(ClampToDac(static_cast<double>(moved.x) - offset.x),
-                          ClampToDac(static_cast<double>(moved.y) - offset.y), point.dwell, point.flags);
+        const coordinate<double> moved = map.Apply(point.x + offset.x, point.y + offset.y);
+        point = MakePoint(ClampToDac(static_cast<double>(TruncToInt32(moved.x)) - offset.x),
+                          ClampToDac(static_cast<double>(TruncToInt32(moved.y)) - offset.y), point.dwell,
+                          point.flags);
     }
 }
 

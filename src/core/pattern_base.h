@@ -139,7 +139,6 @@ class CPattern {
     virtual void OnRenderingSettingsChanged(const PatternRenderingSettings&) {}
 
   private:
-    DacPosition TransformOne(coordinate<double> center, DacPosition position) const;
     std::int32_t BlankingPointCount(double time) const;
 
     PatternRenderingSettings settings_;

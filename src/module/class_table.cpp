@@ -1,6 +1,8 @@
 #include "module/class_table.h"
 
 #include "comtypes/comtypes_registration.h"
+#include "composition/exclusion_shape_classes.h"
+#include "composition/exclusion_zone_classes.h"
 #include "core/rendering_classes.h"
 #include "core/strategy_classes.h"
 #include "dwellmap/dwellmap_registration.h"
@@ -15,7 +17,8 @@ namespace {
 
 std::vector<ClassEntry> BuildClassTable() {
     std::vector<ClassEntry> table;
-    for (auto part : {RenderingClassEntries(), StrategyClassEntries(), ShapeClassEntries()})
+    for (auto part : {RenderingClassEntries(), StrategyClassEntries(), ShapeClassEntries(), ExclusionZoneClassEntries(),
+                       ExclusionShapeClassEntries()})
         table.insert(table.end(), part.begin(), part.end());
     return table;
 }

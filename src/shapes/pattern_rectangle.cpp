@@ -1,0 +1,288 @@
+#include "shapes/pattern_rectangle.h"
+
+#include "core/scan_strategy_conversions.h"
+#include "module/create_instance.h"
+#include "module/geometry_io.h"
+
+#include <boost/thread/lock_types.hpp>
+
+#include <algorithm>
+#include <array>
+#include <cmath>
+#include <stdexcept>
+
+namespace Norvane::Lumis::Scanning {
+
+namespace {
+
+bool IsPitch(double value) {
+    return value > 0.0 && value < 1.0;
+}
+
+std::u16string ToDescription(const std::string& text) {
+    return {text.begin(), text.end()};
+}
+
+} // namespace
+
+CPatternRectangle::CPatternRectangle()
+    : IPatternShapeImpl<IPatternRectangle>(CLSID_PatternRectangle),
+      shape_(CreateInstance<IShapeRectangle>(CLSID_ShapeRectangle)) {
+    UpdateResolutionForDwellTimes();
+    UpdateExclusionShape();
+}
+
+HRESULT CPatternRectangle::get_Rectangle(IRectangleFloat** value) {
+    return Guarded(IID_IPatternRectangle, Mutex(), value,
+                   [&] { *value = CreateRectangleFloat(rectangle_.rectangle).Detach(); });
+}
+
+HRESULT CPatternRectangle::put_Rectangle(IRectangleFloat* value) {
+    return Guarded(IID_IPatternRectangle, Mutex(), [&] {
+        rectangle_.rectangle = ReadRelativeRectangle(value);
+        UpdateExclusionShape();
+    });
+}
+
+HRESULT CPatternRectangle::get_BeginDwellTime(double* value) {
+    return Guarded(IID_IPatternRectangle, Mutex(), value, [&] { *value = rectangle_.beginDwellTime; });
+}
+
+HRESULT CPatternRectangle::put_BeginDwellTime(double value) {
+    return PutDwellTime(value, &RectangleGeometry::beginDwellTime);
+}
+
+HRESULT CPatternRectangle::get_EndDwellTime(double* value) {
+    return Guarded(IID_IPatternRectangle, Mutex(), value, [&] { *value = rectangle_.endDwellTime; });
+}
+
+HRESULT CPatternRectangle::put_EndDwellTime(double value) {
+    return PutDwellTime(value, &RectangleGeometry::endDwellTime);
+}
+
+HRESULT CPatternRectangle::get_ScanStrategy(IScanStrategyRectangular** value) {
+    return Guarded(IID_IPatternRectangle, Mutex(), value,
+                   [&] { *value = MakeScanStrategyRectangular(rectangle_.strategy).Detach(); });
+}
+
+// Pitches must lie strictly within the field; the enumerations are kept as given and read leniently when
+// rendering.
+HRESULT CPatternRectangle::put_ScanStrategy(IScanStrategyRectangular* value) {
+    return Guarded(IID_IPatternRectangle, Mutex(), [&] {
+        const RectangularStrategy strategy = ReadScanStrategyRectangular(value);
+        if (!(IsPitch(strategy.pitchX) && IsPitch(strategy.pitchY)))
+            return E_INVALIDARG;
+        rectangle_.strategy = strategy;
+        return S_OK;
+    });
+}
+
+HRESULT CPatternRectangle::get_TransformationMatrix(ITransformationMatrix2D** value) {
+    return Guarded(IID_IPatternRectangle, Mutex(), value,
+                   [&] { *value = CreateMatrix(GetTransformationMatrix()).Detach(); });
+}
+
+HRESULT CPatternRectangle::put_TransformationMatrix(ITransformationMatrix2D* value) {
+    return Guarded(IID_IPatternRectangle, Mutex(), [&] {
+        SetTransformationMatrix(ReadMatrixProperty(value, "TransformationMatrix"));
+        UpdateExclusionShape();
+    });
+}
+
+HRESULT CPatternRectangle::GetEffectiveLoopTime(double* loopTime) {
+    return Guarded(IID_IPatternRectangle, Mutex(), loopTime, [&] { *loopTime = EffectiveLoopTime(); });
+}
+
+HRESULT CPatternRectangle::Validate(IPatternValidationResult** result) {
+    return Guarded(IID_IPattern, Mutex(), result, [&] { *result = MakeValidation().Detach(); });
+}
+
+// Every pass carries its own blanking; a frame, and a solid fill with an unknown MultiPass, is one pass.
+HRESULT CPatternRectangle::GetLoopTime(double* loopTime) {
+    return Guarded(IID_IPatternRectangle, Mutex(), loopTime, [&] {
+        const double pass = GetPreBlankingTotalTime() + EffectiveLoopTime() + GetPostBlankingTime();
+        *loopTime = RectanglePassCount(rectangle_.strategy) * pass;
+    });
+}
+
+HRESULT CPatternRectangle::GetMinDwellTime(double* dwellTime) {
+    return Guarded(IID_IPatternRectangle, Mutex(), dwellTime,
+                   [&] { *dwellTime = std::min(rectangle_.beginDwellTime, rectangle_.endDwellTime); });
+}
+
+HRESULT CPatternRectangle::GetMaxDwellTime(double* dwellTime) {
+    return Guarded(IID_IPatternRectangle, Mutex(), dwellTime,
+                   [&] { *dwellTime = std::max(rectangle_.beginDwellTime, rectangle_.endDwellTime); });
+}
+
+// The box of all four corners after the matrix, so that a rotated rectangle stays inside it.
+HRESULT CPatternRectangle::GetDacBoundingBox(IRectangleInt** boundingBox) {
+    return Guarded(IID_IPatternRectangle, Mutex(), boundingBox, [&] {
+        const RectangleFloat& area = rectangle_.rectangle;
+        const TransformationMatrix& m = GetTransformationMatrix();
+        const auto map = [&](double x, double y) {
+            return coordinate<double>{m.m0 * x + m.m1 * y + m.m2, m.m3 * x + m.m4 * y + m.m5};
+        };
+        const std::array corners{map(area.left, area.top), map(area.right, area.top),
+                                 map(area.right, area.bottom), map(area.left, area.bottom)};
+        const RectangleFloat box = GetPointsBoundingBox(corners);
+        const DacPosition topLeft = RelativeToDac(box.left, box.top);
+        const DacPosition bottomRight = RelativeToDac(box.right, box.bottom);
+        *boundingBox = CreateRectangleInt({topLeft.x, topLeft.y, bottomRight.x, bottomRight.y}).Detach();
+    });
+}
+
+HRESULT CPatternRectangle::Accept(IPatternShapeVisitor* visitor) {
+    return Guarded(IID_IPatternRectangle, Mutex(), [&] {
+        if (visitor == nullptr)
+            return E_POINTER;
+        return visitor->VisitPatternRectangle(this);
+    });
+}
+
+HRESULT CPatternRectangle::get_IsExclusion(VARIANT_BOOL* value) {
+    return Guarded(IID_IExcludablePatternShape, Mutex(), value,
+                   [&] { *value = ToVariantBool(isExclusion_); });
+}
+
+HRESULT CPatternRectangle::put_IsExclusion(VARIANT_BOOL value) {
+    return Guarded(IID_IExcludablePatternShape, Mutex(), [&] {
+        isExclusion_ = value != 0;
+        UpdateZoneMembership();
+    });
+}
+
+// The shape is made with the object and never replaced, so handing it out takes no lock; a zone that
+// asks a pattern for its shape while holding its own lock cannot wait on this one.
+HRESULT CPatternRectangle::get_Shape(IShape** value) {
+    return Guarded(IID_IExcludablePatternShape, value, [&] {
+        *value = ExclusionShape();
+        (*value)->AddRef();
+    });
+}
+
+HRESULT CPatternRectangle::Clone(IPattern** clone) {
+    return Guarded(IID_ICloneablePattern, Mutex(), clone, [&] {
+        CComPtr<ICloneablePattern> created = CreateInstance<ICloneablePattern>(CLSID_PatternRectangle);
+        CComPtr<IPatternRectangle> copy;
+        CheckResult(created.QueryInterface(&copy));
+        CopyRectanglePropertiesTo(copy);
+        *clone = copy.Detach();
+    });
+}
+
+HRESULT CPatternRectangle::CopyTo(IPattern* target) {
+    return Guarded(IID_ICloneablePattern, Mutex(), [&] {
+        if (target == nullptr)
+            throw std::invalid_argument("pIPattern object is null");
+        CComPtr<IPatternRectangle> rectangle;
+        const HRESULT hr =
+            target->QueryInterface(IPatternRectangle::iid, reinterpret_cast<void**>(&rectangle));
+        if (FAILED(hr))
+            return hr;
+        CopyRectanglePropertiesTo(rectangle);
+        return S_OK;
+    });
+}
+
+CComPtr<IScanDefinition> CPatternRectangle::RenderPattern() {
+    boost::unique_lock<ObjectMutex> lock(Mutex());
+    ValidateOrThrow();
+    CComPtr<IPatternPointList> list =
+        CreatePointList(static_cast<std::uint32_t>(RectangleListPointCount(rectangle_, *this)));
+    WriteRectanglePoints(PointBufferView(list).Points(), rectangle_, *this, PointFlags());
+    TransformPointList({0.0, 0.0}, list);
+    return PackageShapeRendering(list, RectangleMeanDwellTime(rectangle_));
+}
+
+void CPatternRectangle::OnExclusionZoneSet(IExclusionZone* zone) {
+    boost::unique_lock<ObjectMutex> lock(Mutex());
+    if (zone != nullptr && isExclusion_)
+        CheckResult(zone->AddShape(ExclusionShape()));
+}
+
+void CPatternRectangle::OnExclusionZoneCleared() {
+    boost::unique_lock<ObjectMutex> lock(Mutex());
+    if (CComPtr<IExclusionZone> zone = StoredExclusionZone())
+        CheckResult(zone->RemoveShape(ExclusionShape()));
+}
+
+void CPatternRectangle::OnRenderingSettingsChanged(const PatternRenderingSettings&) {
+    UpdateExclusionShape();
+}
+
+HRESULT CPatternRectangle::PutDwellTime(double value, double RectangleGeometry::*field) {
+    return Guarded(IID_IPatternRectangle, Mutex(), [&] {
+        if (!(value > 0.0 && std::isfinite(value)))
+            return E_INVALIDARG;
+        rectangle_.*field = value;
+        UpdateResolutionForDwellTimes();
+        return S_OK;
+    });
+}
+
+void CPatternRectangle::UpdateResolutionForDwellTimes() {
+    UpdateDwellTimeResolution(std::max(rectangle_.beginDwellTime, rectangle_.endDwellTime));
+}
+
+// Dwell times finer than the resolution first, then pitches that give no grid.
+CComPtr<IPatternValidationResult> CPatternRectangle::MakeValidation() {
+    UpdateResolutionForDwellTimes();
+    const double resolution = CPattern::GetDwellTimeResolution();
+    std::string description;
+    if (resolution > rectangle_.beginDwellTime)
+        description += "BeginDwellTime out of range. ";
+    if (resolution > rectangle_.endDwellTime)
+        description += "EndDwellTime out of range. ";
+    description += RectangleGridProblems(rectangle_, *this);
+    return MakeValidationResult(description.empty(), ToDescription(description));
+}
+
+double CPatternRectangle::EffectiveLoopTime() {
+    ValidateOrThrow();
+    return RectangleEffectiveLoopTime(rectangle_, *this);
+}
+
+std::uint8_t CPatternRectangle::PointFlags() const {
+    return isExclusion_ ? PointFlag_Blank : PointFlag_Acquire;
+}
+
+void CPatternRectangle::UpdateExclusionShape() {
+    if (!shape_)
+        return;
+    CheckResult(shape_->put_Rectangle(CreateRectangleFloat(rectangle_.rectangle)));
+    CheckResult(shape_->put_TransformationMatrix(CreateMatrix(GetTransformationMatrix())));
+    CheckResult(shape_->put_DACRangeX(CreateRange(GetAlignmentX().range)));
+    CheckResult(shape_->put_DACRangeY(CreateRange(GetAlignmentY().range)));
+}
+
+void CPatternRectangle::UpdateZoneMembership() {
+    CComPtr<IExclusionZone> zone = StoredExclusionZone();
+    if (!zone)
+        return;
+    if (!isExclusion_) {
+        CheckResult(zone->RemoveShape(ExclusionShape()));
+        return;
+    }
+    VARIANT_BOOL contained = VARIANT_FALSE;
+    CheckResult(zone->ContainsShape(ExclusionShape(), &contained));
+    if (contained == VARIANT_FALSE)
+        CheckResult(zone->AddShape(ExclusionShape()));
+}
+
+IShape* CPatternRectangle::ExclusionShape() const {
+    return shape_.Get();
+}
+
+// Common properties first, then the rectangle's own through the target's setters; the first failing
+// setter ends the copy with its error, and what was copied before stays copied.
+void CPatternRectangle::CopyRectanglePropertiesTo(IPatternRectangle* target) {
+    CopyCommonPatternProperties(this, target);
+    CheckResult(target->put_Rectangle(CreateRectangleFloat(rectangle_.rectangle)));
+    CheckResult(target->put_BeginDwellTime(rectangle_.beginDwellTime));
+    CheckResult(target->put_EndDwellTime(rectangle_.endDwellTime));
+    CheckResult(target->put_ScanStrategy(MakeScanStrategyRectangular(rectangle_.strategy)));
+    CheckResult(target->put_TransformationMatrix(CreateMatrix(GetTransformationMatrix())));
+}
+
+} // namespace Norvane::Lumis::Scanning

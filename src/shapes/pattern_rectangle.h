@@ -1,0 +1,87 @@
+// The rectangle pattern: a rectangle milled line by line (solid fill) or along its outline (frame fill)
+// under a rectangular scan strategy, with a dwell ramping from BeginDwellTime on the first line to
+// EndDwellTime on the last. It also serves as an exclusion shape: it keeps a rectangle exclusion shape in
+// step with its geometry and, marked as exclusion, renders blanked and registers that shape with its zone.
+// Every member of its own holds the object's lock for its whole run.
+#pragma once
+
+#include "core/pattern_impl.h"
+#include "platform/error_info.h"
+#include "shapes/rectangle_generator.h"
+
+#include <beamweaver/exclusion.h>
+#include <beamweaver/shapes.h>
+
+namespace Norvane::Lumis::Scanning {
+
+class CPatternRectangle : public IPatternShapeImpl<IPatternRectangle>,
+                          public IExcludablePatternShape,
+                          public ICloneablePattern,
+                          public ISupportErrorInfoImplEx<IPatternRectangle, IPattern> {
+  public:
+    using Interfaces = InterfaceMap<IPatternRectangle, IExclusionAwarePattern, IExcludablePatternShape,
+                                    ICloneablePattern, ISupportErrorInfo>;
+
+    // Creates the exclusion shape (class ShapeRectangle) and brings it up to date; a failed creation
+    // fails the construction.
+    CPatternRectangle();
+
+    // IPatternRectangle
+    HRESULT get_Rectangle(IRectangleFloat** value) override;
+    HRESULT put_Rectangle(IRectangleFloat* value) override;
+    HRESULT get_BeginDwellTime(double* value) override;
+    HRESULT put_BeginDwellTime(double value) override;
+    HRESULT get_EndDwellTime(double* value) override;
+    HRESULT put_EndDwellTime(double value) override;
+    HRESULT get_ScanStrategy(IScanStrategyRectangular** value) override;
+    HRESULT put_ScanStrategy(IScanStrategyRectangular* value) override;
+    HRESULT get_TransformationMatrix(ITransformationMatrix2D** value) override;
+    HRESULT put_TransformationMatrix(ITransformationMatrix2D* value) override;
+    HRESULT GetEffectiveLoopTime(double* loopTime) override;
+
+    // IPattern
+    HRESULT Validate(IPatternValidationResult** result) override;
+    HRESULT GetLoopTime(double* loopTime) override;
+    HRESULT GetMinDwellTime(double* dwellTime) override;
+    HRESULT GetMaxDwellTime(double* dwellTime) override;
+    HRESULT GetDacBoundingBox(IRectangleInt** boundingBox) override;
+
+    // IPatternShape
+    HRESULT Accept(IPatternShapeVisitor* visitor) override;
+
+    // IExcludablePatternShape
+    HRESULT get_IsExclusion(VARIANT_BOOL* value) override;
+    HRESULT put_IsExclusion(VARIANT_BOOL value) override;
+    HRESULT get_Shape(IShape** value) override;
+
+    // ICloneablePattern
+    HRESULT Clone(IPattern** clone) override;
+    HRESULT CopyTo(IPattern* target) override;
+
+  protected:
+    CComPtr<IScanDefinition> RenderPattern() override;
+    void OnExclusionZoneSet(IExclusionZone* zone) override;
+    void OnExclusionZoneCleared() override;
+    void OnRenderingSettingsChanged(const PatternRenderingSettings& settings) override;
+
+  private:
+    // Stores a dwell time in field and recomputes the resolution; refuses what is not a positive, finite
+    // time.
+    HRESULT PutDwellTime(double value, double RectangleGeometry::*field);
+    void UpdateResolutionForDwellTimes();
+    CComPtr<IPatternValidationResult> MakeValidation();
+    double EffectiveLoopTime();
+    std::uint8_t PointFlags() const;
+    // Sets the shape's Rectangle, TransformationMatrix, DACRangeX and DACRangeY from the pattern.
+    void UpdateExclusionShape();
+    // Puts the shape into the stored zone unless it is there already, or takes it out.
+    void UpdateZoneMembership();
+    IShape* ExclusionShape() const;
+    void CopyRectanglePropertiesTo(IPatternRectangle* target);
+
+    RectangleGeometry rectangle_;
+    bool isExclusion_ = false;
+    CComPtr<IShapeRectangle> shape_;
+};
+
+} // namespace Norvane::Lumis::Scanning
