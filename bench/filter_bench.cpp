@@ -3,8 +3,6 @@
 // removes about a fifth of them. Three runs report points per second: the filter on a plain block with a
 // circle containment test, the same through an exclusion zone holding a circle shape, and the floor of
 // any such pass: writing 10 million 8-byte records into a fresh calloc'd block.
-#include "composition/exclusion_shape_classes.h"
-#include "composition/exclusion_zone_classes.h"
 #include "composition/point_filter.h"
 #include "core/point_buffer_view.h"
 #include "module/class_table.h"
@@ -78,8 +76,6 @@ void BM_FilterPointsCircle(benchmark::State& state) {
 
 CComPtr<IPatternPointFilter> CircleZone() {
     RegisterComponents();
-    RegisterClasses(ExclusionShapeClassEntries());
-    RegisterClasses(ExclusionZoneClassEntries());
     const auto circle = Norvane::CreateInstance<IShapeCircle>(CLSID_ShapeCircle);
     const auto zone = Norvane::CreateInstance<IExclusionZone>(CLSID_ExclusionZone);
     if (circle->put_Center(CreateCoordinate({0.5, 0.5})) != S_OK || circle->put_OuterRadius(0.25) != S_OK ||

@@ -2,7 +2,6 @@
 // allocation, generation, transformation and packaging included), against the floor of the same work:
 // writing as many 8-byte records, composed whole, into a fresh calloc'd block. All report points per
 // second.
-#include "composition/exclusion_shape_classes.h"
 #include "core/scan_strategy_conversions.h"
 #include "core/scan_strategy_values.h"
 #include "module/class_table.h"
@@ -44,7 +43,6 @@ void UseFullDacField(IPatternRectangle* rectangle) {
 
 CComPtr<IPatternRectangle> MakeRectangle(ScanType scanType, const TransformationMatrix& matrix) {
     RegisterComponents();
-    RegisterClasses(ExclusionShapeClassEntries());
     auto rectangle = Norvane::CreateInstance<IPatternRectangle>(CLSID_PatternRectangle);
     UseFullDacField(rectangle);
     RectangularStrategy strategy;

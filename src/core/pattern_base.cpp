@@ -229,15 +229,15 @@ void CPattern::TransformPoints(coordinate<double> center, std::span<PatternPoint
     if (offset == DacPosition{}) {
         for (PatternPoint& point : points) {
             const coordinate<double> moved = map.Apply(point.x, point.y);
-            point = MakePoint(ClampToDac(moved.x), ClampToDac(moved.y), point.dwell, point.flags);
+            StorePoint(&point, MakePoint(ClampToDac(moved.x), ClampToDac(moved.y), point.dwell, point.flags));
         }
         return;
     }
     for (PatternPoint& point : points) {
         const coordinate<double> moved = map.Apply(point.x + offset.x, point.y + offset.y);
-        point = MakePoint(ClampToDac(static_cast<double>(TruncToInt32(moved.x)) - offset.x),
-                          ClampToDac(static_cast<double>(TruncToInt32(moved.y)) - offset.y), point.dwell,
-                          point.flags);
+        StorePoint(&point, MakePoint(ClampToDac(static_cast<double>(TruncToInt32(moved.x)) - offset.x),
+                                     ClampToDac(static_cast<double>(TruncToInt32(moved.y)) - offset.y), point.dwell,
+                                     point.flags));
     }
 }
 

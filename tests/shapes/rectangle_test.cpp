@@ -1,8 +1,6 @@
 #include "shapes/pattern_rectangle.h"
 #include "shapes/shape_classes.h"
 
-#include "composition/exclusion_shape_classes.h"
-#include "composition/exclusion_zone_classes.h"
 #include "core/point_buffer_view.h"
 #include "core/scan_strategy_conversions.h"
 #include "module/class_table.h"
@@ -92,8 +90,6 @@ class RectangleTest : public ::testing::Test {
   protected:
     void SetUp() override {
         RegisterComponents();
-        RegisterClasses(ExclusionShapeClassEntries());
-        RegisterClasses(ExclusionZoneClassEntries());
         rectangle_ = NewRectangle();
         SetErrorInfo(0, nullptr);
     }
