@@ -6,6 +6,7 @@
 #include "core/raster_rendering_properties.h"
 #include "module/error_reporting.h"
 #include "module/geometry_io.h"
+#include "module/property_read.h"
 
 #include <stdexcept>
 #include <string>
@@ -13,22 +14,6 @@
 namespace Norvane::Lumis::Scanning {
 
 namespace {
-
-// Calls one getter of object and returns its value; a failure throws with the callee's error information.
-template <class Object, class Declaring, class T>
-T ReadValue(Object* object, HRESULT (Declaring::*getter)(T*)) {
-    T value{};
-    CheckResult((object->*getter)(&value));
-    return value;
-}
-
-// Calls a getter that hands out an object; the caller owns the reference.
-template <class Object, class Declaring, class I>
-CComPtr<I> ReadObject(Object* object, HRESULT (Declaring::*getter)(I**)) {
-    CComPtr<I> value;
-    CheckResult((object->*getter)(&value));
-    return value;
-}
 
 void RequireObject(const void* value, std::string_view name) {
     if (value == nullptr)

@@ -3,21 +3,13 @@
 #include "core/scan_strategy_circular.h"
 #include "core/scan_strategy_raster.h"
 #include "core/scan_strategy_rectangular.h"
-#include "module/error_reporting.h"
+#include "module/property_read.h"
 
 #include <stdexcept>
 
 namespace Norvane::Lumis::Scanning {
 
 namespace {
-
-// Calls one getter of object and returns its value; a failure throws with the callee's error information.
-template <class Object, class Declaring, class T>
-T ReadValue(Object* object, HRESULT (Declaring::*getter)(T*)) {
-    T value{};
-    CheckResult((object->*getter)(&value));
-    return value;
-}
 
 void RequireStrategy(const void* value) {
     if (value == nullptr)
