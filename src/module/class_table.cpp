@@ -7,6 +7,8 @@
 #include "core/strategy_classes.h"
 #include "dwellmap/dwellmap_registration.h"
 #include "platform/module_lock.h"
+#include "shapes/circle_classes.h"
+#include "shapes/polygon_classes.h"
 #include "shapes/shape_classes.h"
 
 #include <beamweaver/identifiers.h>
@@ -63,8 +65,9 @@ std::size_t TablePosition(const ClassEntry& entry) {
 
 std::vector<ClassEntry> BuildClassTable() {
     std::vector<ClassEntry> table;
-    for (auto part : {RenderingClassEntries(), StrategyClassEntries(), ShapeClassEntries(),
-                      ExclusionZoneClassEntries(), ExclusionShapeClassEntries()})
+    for (auto part :
+         {RenderingClassEntries(), StrategyClassEntries(), ShapeClassEntries(), CircleClassEntries(),
+          PolygonClassEntries(), ExclusionZoneClassEntries(), ExclusionShapeClassEntries()})
         table.insert(table.end(), part.begin(), part.end());
     std::stable_sort(table.begin(), table.end(), [](const ClassEntry& a, const ClassEntry& b) {
         return TablePosition(a) < TablePosition(b);

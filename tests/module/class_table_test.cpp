@@ -34,7 +34,8 @@ TEST_F(ClassTableTest, EveryEntryIsCreatableByIdentifierAndProgId) {
 
 TEST_F(ClassTableTest, EntriesFollowThePublishedOrder) {
     // Of the classes built so far: the two alignments and rendering properties (104 to 107), the rectangle
-    // (108), the line (110), the strategies (122 to 124), the zone (125) and the shapes (126 to 128).
+    // (108), the circle (109), the line (110), the polygon (119), the strategies (122 to 124), the zone (125)
+    // and the shapes (126 to 128).
     std::vector<std::string> names;
     for (const ClassEntry& entry : BeamweaverClassTable())
         names.push_back(entry.name);
@@ -43,7 +44,9 @@ TEST_F(ClassTableTest, EntriesFollowThePublishedOrder) {
                                             "RasterRenderingProperties",
                                             "PatternRenderingProperties",
                                             "PatternRectangle",
+                                            "PatternCircle",
                                             "PatternLine",
+                                            "PatternPolygon",
                                             "ScanStrategyRaster",
                                             "ScanStrategyRectangular",
                                             "ScanStrategyCircular",

@@ -1,0 +1,279 @@
+#include "shapes/pattern_polygon.h"
+
+#include "core/scan_strategy_conversions.h"
+#include "module/create_instance.h"
+#include "module/geometry_io.h"
+
+#include <boost/thread/lock_types.hpp>
+
+#include <algorithm>
+#include <cmath>
+#include <stdexcept>
+
+namespace Norvane::Lumis::Scanning {
+
+namespace {
+
+bool IsPitch(double value) {
+    return value > 0.0 && value < 1.0;
+}
+
+std::u16string ToDescription(const std::string& text) {
+    return {text.begin(), text.end()};
+}
+
+} // namespace
+
+CPatternPolygon::CPatternPolygon()
+    : IPatternShapeImpl<IPatternPolygon>(CLSID_PatternPolygon),
+      shape_(CreateInstance<IShapePolygon>(CLSID_ShapePolygon)) {
+    UpdateResolutionForDwellTimes();
+    UpdateExclusionShape();
+}
+
+// The shape takes the vertex first, so that a refusal there leaves both unchanged.
+HRESULT CPatternPolygon::AddPoint(ICoordinateFloat* point) {
+    return Guarded(IID_IPatternPolygon, Mutex(), [&] {
+        const coordinate<double> vertex = ReadRelativeCoordinate(point, "Point");
+        CheckResult(shape_->AddPoint(CreateCoordinate(vertex)));
+        polygon_.vertices.push_back(vertex);
+    });
+}
+
+HRESULT CPatternPolygon::ModifyPoint(std::int32_t index, ICoordinateFloat* point) {
+    return Guarded(IID_IPatternPolygon, Mutex(), [&] {
+        const coordinate<double> vertex = ReadRelativeCoordinate(point, "Point");
+        if (index < 0 || static_cast<std::size_t>(index) >= polygon_.vertices.size())
+            throw std::invalid_argument("Index out of range");
+        CheckResult(shape_->ModifyPoint(index, CreateCoordinate(vertex)));
+        polygon_.vertices[static_cast<std::size_t>(index)] = vertex;
+    });
+}
+
+HRESULT CPatternPolygon::get_BeginDwellTime(double* value) {
+    return Guarded(IID_IPatternPolygon, Mutex(), value, [&] { *value = polygon_.beginDwellTime; });
+}
+
+HRESULT CPatternPolygon::put_BeginDwellTime(double value) {
+    return PutDwellTime(value, &PolygonGeometry::beginDwellTime);
+}
+
+HRESULT CPatternPolygon::get_EndDwellTime(double* value) {
+    return Guarded(IID_IPatternPolygon, Mutex(), value, [&] { *value = polygon_.endDwellTime; });
+}
+
+HRESULT CPatternPolygon::put_EndDwellTime(double value) {
+    return PutDwellTime(value, &PolygonGeometry::endDwellTime);
+}
+
+HRESULT CPatternPolygon::get_ScanStrategy(IScanStrategyRectangular** value) {
+    return Guarded(IID_IPatternPolygon, Mutex(), value,
+                   [&] { *value = MakeScanStrategyRectangular(polygon_.strategy).Detach(); });
+}
+
+// Pitches must lie strictly within the field; the enumerations are kept as given and checked when
+// rendering.
+HRESULT CPatternPolygon::put_ScanStrategy(IScanStrategyRectangular* value) {
+    return Guarded(IID_IPatternPolygon, Mutex(), [&] {
+        const RectangularStrategy strategy = ReadScanStrategyRectangular(value);
+        if (!(IsPitch(strategy.pitchX) && IsPitch(strategy.pitchY)))
+            return E_INVALIDARG;
+        polygon_.strategy = strategy;
+        return S_OK;
+    });
+}
+
+HRESULT CPatternPolygon::get_TransformationMatrix(ITransformationMatrix2D** value) {
+    return Guarded(IID_IPatternPolygon, Mutex(), value,
+                   [&] { *value = CreateMatrix(GetTransformationMatrix()).Detach(); });
+}
+
+HRESULT CPatternPolygon::put_TransformationMatrix(ITransformationMatrix2D* value) {
+    return Guarded(IID_IPatternPolygon, Mutex(), [&] {
+        SetTransformationMatrix(ReadMatrixProperty(value, "TransformationMatrix"));
+        UpdateExclusionShape();
+    });
+}
+
+HRESULT CPatternPolygon::GetEffectiveLoopTime(double* loopTime) {
+    return Guarded(IID_IPatternPolygon, Mutex(), loopTime, [&] { *loopTime = EffectiveLoopTime(); });
+}
+
+HRESULT CPatternPolygon::Validate(IPatternValidationResult** result) {
+    return Guarded(IID_IPattern, Mutex(), result, [&] { *result = MakeValidation().Detach(); });
+}
+
+// Every pass carries its own blanking; a frame is one pass.
+HRESULT CPatternPolygon::GetLoopTime(double* loopTime) {
+    return Guarded(IID_IPatternPolygon, Mutex(), loopTime, [&] {
+        const double pass = GetPreBlankingTotalTime() + EffectiveLoopTime() + GetPostBlankingTime();
+        *loopTime = PolygonPassCount(polygon_.strategy) * pass;
+    });
+}
+
+HRESULT CPatternPolygon::GetMinDwellTime(double* dwellTime) {
+    return Guarded(IID_IPatternPolygon, Mutex(), dwellTime,
+                   [&] { *dwellTime = std::min(polygon_.beginDwellTime, polygon_.endDwellTime); });
+}
+
+HRESULT CPatternPolygon::GetMaxDwellTime(double* dwellTime) {
+    return Guarded(IID_IPatternPolygon, Mutex(), dwellTime,
+                   [&] { *dwellTime = std::max(polygon_.beginDwellTime, polygon_.endDwellTime); });
+}
+
+// The vertices' box, its two corners mapped by the matrix about the origin and put in order.
+HRESULT CPatternPolygon::GetDacBoundingBox(IRectangleInt** boundingBox) {
+    return Guarded(IID_IPatternPolygon, Mutex(), boundingBox, [&] {
+        const RectangleFloat box = GetPointsBoundingBox(polygon_.vertices);
+        *boundingBox =
+            CreateRectangleInt(TransformedDacBox({box.left, box.top}, {box.right, box.bottom})).Detach();
+    });
+}
+
+HRESULT CPatternPolygon::Accept(IPatternShapeVisitor* visitor) {
+    return Guarded(IID_IPatternPolygon, Mutex(), [&] {
+        if (visitor == nullptr)
+            return E_POINTER;
+        return visitor->VisitPatternPolygon(this);
+    });
+}
+
+HRESULT CPatternPolygon::get_IsExclusion(VARIANT_BOOL* value) {
+    return Guarded(IID_IExcludablePatternShape, Mutex(), value,
+                   [&] { *value = ToVariantBool(isExclusion_); });
+}
+
+HRESULT CPatternPolygon::put_IsExclusion(VARIANT_BOOL value) {
+    return Guarded(IID_IExcludablePatternShape, Mutex(), [&] {
+        isExclusion_ = value != 0;
+        UpdateZoneMembership();
+    });
+}
+
+// The shape is made with the object and never replaced, so handing it out takes no lock; a zone that
+// asks a pattern for its shape while holding its own lock cannot wait on this one.
+HRESULT CPatternPolygon::get_Shape(IShape** value) {
+    return Guarded(IID_IExcludablePatternShape, value, [&] {
+        *value = ExclusionShape();
+        (*value)->AddRef();
+    });
+}
+
+HRESULT CPatternPolygon::Clone(IPattern** clone) {
+    return Guarded(IID_ICloneablePattern, Mutex(), clone, [&] {
+        CComPtr<ICloneablePattern> created = CreateInstance<ICloneablePattern>(CLSID_PatternPolygon);
+        CComPtr<IPatternPolygon> copy;
+        CheckResult(created.QueryInterface(&copy));
+        CopyPolygonPropertiesTo(copy);
+        *clone = copy.Detach();
+    });
+}
+
+HRESULT CPatternPolygon::CopyTo(IPattern* target) {
+    return Guarded(IID_ICloneablePattern, Mutex(), [&] {
+        if (target == nullptr)
+            throw std::invalid_argument("pIPattern object is null");
+        CComPtr<IPatternPolygon> polygon;
+        const HRESULT hr = target->QueryInterface(IPatternPolygon::iid, reinterpret_cast<void**>(&polygon));
+        if (FAILED(hr))
+            return hr;
+        CopyPolygonPropertiesTo(polygon);
+        return S_OK;
+    });
+}
+
+CComPtr<IScanDefinition> CPatternPolygon::RenderPattern() {
+    boost::unique_lock<ObjectMutex> lock(Mutex());
+    ValidateOrThrow();
+    CComPtr<IPatternPointList> list =
+        CreatePointList(static_cast<std::uint32_t>(PolygonListPointCount(polygon_, *this)));
+    WritePolygonPoints(PointBufferView(list).Points(), polygon_, *this, PointFlags());
+    TransformPointList({0.0, 0.0}, list);
+    return PackageShapeRendering(list, PolygonMeanDwellTime(polygon_));
+}
+
+void CPatternPolygon::OnExclusionZoneSet(IExclusionZone* zone) {
+    boost::unique_lock<ObjectMutex> lock(Mutex());
+    if (zone != nullptr && isExclusion_)
+        CheckResult(zone->AddShape(ExclusionShape()));
+}
+
+void CPatternPolygon::OnExclusionZoneCleared() {
+    boost::unique_lock<ObjectMutex> lock(Mutex());
+    if (CComPtr<IExclusionZone> zone = StoredExclusionZone())
+        CheckResult(zone->RemoveShape(ExclusionShape()));
+}
+
+void CPatternPolygon::OnRenderingSettingsChanged(const PatternRenderingSettings&) {
+    UpdateExclusionShape();
+}
+
+HRESULT CPatternPolygon::PutDwellTime(double value, double PolygonGeometry::*field) {
+    return Guarded(IID_IPatternPolygon, Mutex(), [&] {
+        if (!(value > 0.0 && std::isfinite(value)))
+            return E_INVALIDARG;
+        polygon_.*field = value;
+        UpdateResolutionForDwellTimes();
+        return S_OK;
+    });
+}
+
+void CPatternPolygon::UpdateResolutionForDwellTimes() {
+    UpdateDwellTimeResolution(std::max(polygon_.beginDwellTime, polygon_.endDwellTime));
+}
+
+CComPtr<IPatternValidationResult> CPatternPolygon::MakeValidation() {
+    UpdateResolutionForDwellTimes();
+    const std::string description = PolygonValidationProblems(polygon_, *this);
+    return MakeValidationResult(description.empty(), ToDescription(description));
+}
+
+double CPatternPolygon::EffectiveLoopTime() {
+    ValidateOrThrow();
+    return PolygonEffectiveLoopTime(polygon_, *this);
+}
+
+std::uint8_t CPatternPolygon::PointFlags() const {
+    return isExclusion_ ? PointFlag_Blank : PointFlag_Acquire;
+}
+
+void CPatternPolygon::UpdateExclusionShape() {
+    if (!shape_)
+        return;
+    CheckResult(shape_->put_TransformationMatrix(CreateMatrix(GetTransformationMatrix())));
+    CheckResult(shape_->put_DACRangeX(CreateRange(GetAlignmentX().range)));
+    CheckResult(shape_->put_DACRangeY(CreateRange(GetAlignmentY().range)));
+}
+
+void CPatternPolygon::UpdateZoneMembership() {
+    CComPtr<IExclusionZone> zone = StoredExclusionZone();
+    if (!zone)
+        return;
+    if (!isExclusion_) {
+        CheckResult(zone->RemoveShape(ExclusionShape()));
+        return;
+    }
+    VARIANT_BOOL contained = VARIANT_FALSE;
+    CheckResult(zone->ContainsShape(ExclusionShape(), &contained));
+    if (contained == VARIANT_FALSE)
+        CheckResult(zone->AddShape(ExclusionShape()));
+}
+
+IShape* CPatternPolygon::ExclusionShape() const {
+    return shape_.Get();
+}
+
+// Common properties first, then the polygon's own, its vertices appended after any the target holds, through
+// the target's setters; the first failing setter ends the copy with its error, and what was copied before
+// stays copied.
+void CPatternPolygon::CopyPolygonPropertiesTo(IPatternPolygon* target) {
+    CopyCommonPatternProperties(this, target);
+    CheckResult(target->put_BeginDwellTime(polygon_.beginDwellTime));
+    CheckResult(target->put_EndDwellTime(polygon_.endDwellTime));
+    CheckResult(target->put_ScanStrategy(MakeScanStrategyRectangular(polygon_.strategy)));
+    CheckResult(target->put_TransformationMatrix(CreateMatrix(GetTransformationMatrix())));
+    for (const coordinate<double>& vertex : polygon_.vertices)
+        CheckResult(target->AddPoint(CreateCoordinate(vertex)));
+}
+
+} // namespace Norvane::Lumis::Scanning

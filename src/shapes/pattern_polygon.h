@@ -1,0 +1,87 @@
+// The polygon pattern: an arbitrary (also concave) polygon milled by scan lines (solid fill) or along its
+// outline (frame fill) under a rectangular scan strategy, with a dwell stepping per scan line from
+// BeginDwellTime to EndDwellTime. It also serves as an exclusion shape: it keeps a polygon exclusion shape
+// in step with its vertices and geometry and, marked as exclusion, renders blanked and registers that
+// shape with its zone. Every member of its own holds the object's lock for its whole run.
+#pragma once
+
+#include "core/pattern_impl.h"
+#include "platform/error_info.h"
+#include "shapes/polygon_generator.h"
+
+#include <beamweaver/exclusion.h>
+#include <beamweaver/polygon.h>
+
+namespace Norvane::Lumis::Scanning {
+
+class CPatternPolygon : public IPatternShapeImpl<IPatternPolygon>,
+                        public IExcludablePatternShape,
+                        public ICloneablePattern,
+                        public ISupportErrorInfoImplEx<IPatternPolygon, IPattern> {
+  public:
+    using Interfaces = InterfaceMap<IPatternPolygon, IExclusionAwarePattern, IExcludablePatternShape,
+                                    ICloneablePattern, ISupportErrorInfo>;
+
+    // Creates the exclusion shape (class ShapePolygon) and brings it up to date; a failed creation fails
+    // the construction.
+    CPatternPolygon();
+
+    // IPatternPolygon
+    HRESULT AddPoint(ICoordinateFloat* point) override;
+    HRESULT ModifyPoint(std::int32_t index, ICoordinateFloat* point) override;
+    HRESULT get_BeginDwellTime(double* value) override;
+    HRESULT put_BeginDwellTime(double value) override;
+    HRESULT get_EndDwellTime(double* value) override;
+    HRESULT put_EndDwellTime(double value) override;
+    HRESULT get_ScanStrategy(IScanStrategyRectangular** value) override;
+    HRESULT put_ScanStrategy(IScanStrategyRectangular* value) override;
+    HRESULT get_TransformationMatrix(ITransformationMatrix2D** value) override;
+    HRESULT put_TransformationMatrix(ITransformationMatrix2D* value) override;
+    HRESULT GetEffectiveLoopTime(double* loopTime) override;
+
+    // IPattern
+    HRESULT Validate(IPatternValidationResult** result) override;
+    HRESULT GetLoopTime(double* loopTime) override;
+    HRESULT GetMinDwellTime(double* dwellTime) override;
+    HRESULT GetMaxDwellTime(double* dwellTime) override;
+    HRESULT GetDacBoundingBox(IRectangleInt** boundingBox) override;
+
+    // IPatternShape
+    HRESULT Accept(IPatternShapeVisitor* visitor) override;
+
+    // IExcludablePatternShape
+    HRESULT get_IsExclusion(VARIANT_BOOL* value) override;
+    HRESULT put_IsExclusion(VARIANT_BOOL value) override;
+    HRESULT get_Shape(IShape** value) override;
+
+    // ICloneablePattern
+    HRESULT Clone(IPattern** clone) override;
+    HRESULT CopyTo(IPattern* target) override;
+
+  protected:
+    CComPtr<IScanDefinition> RenderPattern() override;
+    void OnExclusionZoneSet(IExclusionZone* zone) override;
+    void OnExclusionZoneCleared() override;
+    void OnRenderingSettingsChanged(const PatternRenderingSettings& settings) override;
+
+  private:
+    // Stores a dwell time in field and recomputes the resolution; refuses what is not a positive, finite
+    // time.
+    HRESULT PutDwellTime(double value, double PolygonGeometry::*field);
+    void UpdateResolutionForDwellTimes();
+    CComPtr<IPatternValidationResult> MakeValidation();
+    double EffectiveLoopTime();
+    std::uint8_t PointFlags() const;
+    // Sets the shape's TransformationMatrix, DACRangeX and DACRangeY from the pattern.
+    void UpdateExclusionShape();
+    // Puts the shape into the stored zone unless it is there already, or takes it out.
+    void UpdateZoneMembership();
+    IShape* ExclusionShape() const;
+    void CopyPolygonPropertiesTo(IPatternPolygon* target);
+
+    PolygonGeometry polygon_;
+    bool isExclusion_ = false;
+    CComPtr<IShapePolygon> shape_;
+};
+
+} // namespace Norvane::Lumis::Scanning
