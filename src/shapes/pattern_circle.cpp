@@ -32,8 +32,7 @@ std::u16string ToDescription(const std::string& text) {
 } // namespace
 
 CPatternCircle::CPatternCircle()
-    : IPatternShapeImpl<IPatternCircle>(CLSID_PatternCircle),
-      shape_(CreateInstance<IShapeCircle>(CLSID_ShapeCircle)) {
+    : ExcludablePatternImpl<IPatternCircle, IShapeCircle>(CLSID_PatternCircle, CLSID_ShapeCircle) {
     UpdateResolutionForDwellTimes();
     UpdateExclusionShape();
 }
@@ -198,27 +197,6 @@ HRESULT CPatternCircle::Accept(IPatternShapeVisitor* visitor) {
     });
 }
 
-HRESULT CPatternCircle::get_IsExclusion(VARIANT_BOOL* value) {
-    return Guarded(IID_IExcludablePatternShape, Mutex(), value,
-                   [&] { *value = ToVariantBool(isExclusion_); });
-}
-
-HRESULT CPatternCircle::put_IsExclusion(VARIANT_BOOL value) {
-    return Guarded(IID_IExcludablePatternShape, Mutex(), [&] {
-        isExclusion_ = value != 0;
-        UpdateZoneMembership();
-    });
-}
-
-// The shape is made with the object and never replaced, so handing it out takes no lock; a zone that
-// asks a pattern for its shape while holding its own lock cannot wait on this one.
-HRESULT CPatternCircle::get_Shape(IShape** value) {
-    return Guarded(IID_IExcludablePatternShape, value, [&] {
-        *value = ExclusionShape();
-        (*value)->AddRef();
-    });
-}
-
 HRESULT CPatternCircle::Clone(IPattern** clone) {
     return Guarded(IID_ICloneablePattern, Mutex(), clone, [&] {
         CComPtr<ICloneablePattern> created = CreateInstance<ICloneablePattern>(CLSID_PatternCircle);
@@ -250,18 +228,6 @@ CComPtr<IScanDefinition> CPatternCircle::RenderPattern() {
     WriteCirclePoints(PointBufferView(list).Points(), circle_, *this, PointFlags());
     TransformPointList({0.0, 0.0}, list);
     return PackageShapeRendering(list, (circle_.innerDwellTime + circle_.outerDwellTime) * 0.5);
-}
-
-void CPatternCircle::OnExclusionZoneSet(IExclusionZone* zone) {
-    boost::unique_lock<ObjectMutex> lock(Mutex());
-    if (zone != nullptr && isExclusion_)
-        CheckResult(zone->AddShape(ExclusionShape()));
-}
-
-void CPatternCircle::OnExclusionZoneCleared() {
-    boost::unique_lock<ObjectMutex> lock(Mutex());
-    if (CComPtr<IExclusionZone> zone = StoredExclusionZone())
-        CheckResult(zone->RemoveShape(ExclusionShape()));
 }
 
 void CPatternCircle::OnRenderingSettingsChanged(const PatternRenderingSettings&) {
@@ -349,36 +315,18 @@ double CPatternCircle::EffectiveLoopTime() {
 }
 
 std::uint8_t CPatternCircle::PointFlags() const {
-    return isExclusion_ ? PointFlag_Blank : PointFlag_Acquire;
+    return IsExclusion() ? PointFlag_Blank : PointFlag_Acquire;
 }
 
 void CPatternCircle::UpdateExclusionShape() {
-    if (!shape_)
+    if (!Shape())
         return;
-    CheckResult(shape_->put_Center(CreateCoordinate(circle_.center)));
-    CheckResult(shape_->put_InnerRadius(circle_.innerRadius));
-    CheckResult(shape_->put_OuterRadius(circle_.outerRadius));
-    CheckResult(shape_->put_TransformationMatrix(CreateMatrix(GetTransformationMatrix())));
-    CheckResult(shape_->put_DACRangeX(CreateRange(GetAlignmentX().range)));
-    CheckResult(shape_->put_DACRangeY(CreateRange(GetAlignmentY().range)));
-}
-
-void CPatternCircle::UpdateZoneMembership() {
-    CComPtr<IExclusionZone> zone = StoredExclusionZone();
-    if (!zone)
-        return;
-    if (!isExclusion_) {
-        CheckResult(zone->RemoveShape(ExclusionShape()));
-        return;
-    }
-    VARIANT_BOOL contained = VARIANT_FALSE;
-    CheckResult(zone->ContainsShape(ExclusionShape(), &contained));
-    if (contained == VARIANT_FALSE)
-        CheckResult(zone->AddShape(ExclusionShape()));
-}
-
-IShape* CPatternCircle::ExclusionShape() const {
-    return shape_.Get();
+    CheckResult(Shape()->put_Center(CreateCoordinate(circle_.center)));
+    CheckResult(Shape()->put_InnerRadius(circle_.innerRadius));
+    CheckResult(Shape()->put_OuterRadius(circle_.outerRadius));
+    CheckResult(Shape()->put_TransformationMatrix(CreateMatrix(GetTransformationMatrix())));
+    CheckResult(Shape()->put_DACRangeX(CreateRange(GetAlignmentX().range)));
+    CheckResult(Shape()->put_DACRangeY(CreateRange(GetAlignmentY().range)));
 }
 
 // Common properties first, then the circle's own through the target's setters; the first failing setter

@@ -8,14 +8,14 @@
 #include "core/pattern_impl.h"
 #include "platform/error_info.h"
 #include "shapes/circle_generator.h"
+#include "shapes/excludable_pattern_impl.h"
 
 #include <beamweaver/circle.h>
 #include <beamweaver/exclusion.h>
 
 namespace Norvane::Lumis::Scanning {
 
-class CPatternCircle : public IPatternShapeImpl<IPatternCircle>,
-                       public IExcludablePatternShape,
+class CPatternCircle : public ExcludablePatternImpl<IPatternCircle, IShapeCircle>,
                        public ICloneablePattern,
                        public ISupportErrorInfoImplEx<IPatternCircle, IPattern> {
   public:
@@ -60,19 +60,12 @@ class CPatternCircle : public IPatternShapeImpl<IPatternCircle>,
     // IPatternShape
     HRESULT Accept(IPatternShapeVisitor* visitor) override;
 
-    // IExcludablePatternShape
-    HRESULT get_IsExclusion(VARIANT_BOOL* value) override;
-    HRESULT put_IsExclusion(VARIANT_BOOL value) override;
-    HRESULT get_Shape(IShape** value) override;
-
     // ICloneablePattern
     HRESULT Clone(IPattern** clone) override;
     HRESULT CopyTo(IPattern* target) override;
 
   protected:
     CComPtr<IScanDefinition> RenderPattern() override;
-    void OnExclusionZoneSet(IExclusionZone* zone) override;
-    void OnExclusionZoneCleared() override;
     void OnRenderingSettingsChanged(const PatternRenderingSettings& settings) override;
 
   private:
@@ -87,14 +80,9 @@ class CPatternCircle : public IPatternShapeImpl<IPatternCircle>,
     std::uint8_t PointFlags() const;
     // Sets the shape's Center, radii, TransformationMatrix, DACRangeX and DACRangeY from the pattern.
     void UpdateExclusionShape();
-    // Puts the shape into the stored zone unless it is there already, or takes it out.
-    void UpdateZoneMembership();
-    IShape* ExclusionShape() const;
     void CopyCirclePropertiesTo(IPatternCircle* target);
 
     CircleGeometry circle_;
-    bool isExclusion_ = false;
-    CComPtr<IShapeCircle> shape_;
 };
 
 // A circle pattern in its circular-scan form (see its constructor).

@@ -25,8 +25,7 @@ std::u16string ToDescription(const std::string& text) {
 } // namespace
 
 CPatternPolygon::CPatternPolygon()
-    : IPatternShapeImpl<IPatternPolygon>(CLSID_PatternPolygon),
-      shape_(CreateInstance<IShapePolygon>(CLSID_ShapePolygon)) {
+    : ExcludablePatternImpl<IPatternPolygon, IShapePolygon>(CLSID_PatternPolygon, CLSID_ShapePolygon) {
     UpdateResolutionForDwellTimes();
     UpdateExclusionShape();
 }
@@ -35,7 +34,7 @@ CPatternPolygon::CPatternPolygon()
 HRESULT CPatternPolygon::AddPoint(ICoordinateFloat* point) {
     return Guarded(IID_IPatternPolygon, Mutex(), [&] {
         const coordinate<double> vertex = ReadRelativeCoordinate(point, "Point");
-        CheckResult(shape_->AddPoint(CreateCoordinate(vertex)));
+        CheckResult(Shape()->AddPoint(CreateCoordinate(vertex)));
         polygon_.vertices.push_back(vertex);
     });
 }
@@ -45,7 +44,7 @@ HRESULT CPatternPolygon::ModifyPoint(std::int32_t index, ICoordinateFloat* point
         const coordinate<double> vertex = ReadRelativeCoordinate(point, "Point");
         if (index < 0 || static_cast<std::size_t>(index) >= polygon_.vertices.size())
             throw std::invalid_argument("Index out of range");
-        CheckResult(shape_->ModifyPoint(index, CreateCoordinate(vertex)));
+        CheckResult(Shape()->ModifyPoint(index, CreateCoordinate(vertex)));
         polygon_.vertices[static_cast<std::size_t>(index)] = vertex;
     });
 }
@@ -138,27 +137,6 @@ HRESULT CPatternPolygon::Accept(IPatternShapeVisitor* visitor) {
     });
 }
 
-HRESULT CPatternPolygon::get_IsExclusion(VARIANT_BOOL* value) {
-    return Guarded(IID_IExcludablePatternShape, Mutex(), value,
-                   [&] { *value = ToVariantBool(isExclusion_); });
-}
-
-HRESULT CPatternPolygon::put_IsExclusion(VARIANT_BOOL value) {
-    return Guarded(IID_IExcludablePatternShape, Mutex(), [&] {
-        isExclusion_ = value != 0;
-        UpdateZoneMembership();
-    });
-}
-
-// The shape is made with the object and never replaced, so handing it out takes no lock; a zone that
-// asks a pattern for its shape while holding its own lock cannot wait on this one.
-HRESULT CPatternPolygon::get_Shape(IShape** value) {
-    return Guarded(IID_IExcludablePatternShape, value, [&] {
-        *value = ExclusionShape();
-        (*value)->AddRef();
-    });
-}
-
 HRESULT CPatternPolygon::Clone(IPattern** clone) {
     return Guarded(IID_ICloneablePattern, Mutex(), clone, [&] {
         CComPtr<ICloneablePattern> created = CreateInstance<ICloneablePattern>(CLSID_PatternPolygon);
@@ -192,18 +170,6 @@ CComPtr<IScanDefinition> CPatternPolygon::RenderPattern() {
     return PackageShapeRendering(list, PolygonMeanDwellTime(polygon_));
 }
 
-void CPatternPolygon::OnExclusionZoneSet(IExclusionZone* zone) {
-    boost::unique_lock<ObjectMutex> lock(Mutex());
-    if (zone != nullptr && isExclusion_)
-        CheckResult(zone->AddShape(ExclusionShape()));
-}
-
-void CPatternPolygon::OnExclusionZoneCleared() {
-    boost::unique_lock<ObjectMutex> lock(Mutex());
-    if (CComPtr<IExclusionZone> zone = StoredExclusionZone())
-        CheckResult(zone->RemoveShape(ExclusionShape()));
-}
-
 void CPatternPolygon::OnRenderingSettingsChanged(const PatternRenderingSettings&) {
     UpdateExclusionShape();
 }
@@ -234,33 +200,15 @@ double CPatternPolygon::EffectiveLoopTime() {
 }
 
 std::uint8_t CPatternPolygon::PointFlags() const {
-    return isExclusion_ ? PointFlag_Blank : PointFlag_Acquire;
+    return IsExclusion() ? PointFlag_Blank : PointFlag_Acquire;
 }
 
 void CPatternPolygon::UpdateExclusionShape() {
-    if (!shape_)
+    if (!Shape())
         return;
-    CheckResult(shape_->put_TransformationMatrix(CreateMatrix(GetTransformationMatrix())));
-    CheckResult(shape_->put_DACRangeX(CreateRange(GetAlignmentX().range)));
-    CheckResult(shape_->put_DACRangeY(CreateRange(GetAlignmentY().range)));
-}
-
-void CPatternPolygon::UpdateZoneMembership() {
-    CComPtr<IExclusionZone> zone = StoredExclusionZone();
-    if (!zone)
-        return;
-    if (!isExclusion_) {
-        CheckResult(zone->RemoveShape(ExclusionShape()));
-        return;
-    }
-    VARIANT_BOOL contained = VARIANT_FALSE;
-    CheckResult(zone->ContainsShape(ExclusionShape(), &contained));
-    if (contained == VARIANT_FALSE)
-        CheckResult(zone->AddShape(ExclusionShape()));
-}
-
-IShape* CPatternPolygon::ExclusionShape() const {
-    return shape_.Get();
+    CheckResult(Shape()->put_TransformationMatrix(CreateMatrix(GetTransformationMatrix())));
+    CheckResult(Shape()->put_DACRangeX(CreateRange(GetAlignmentX().range)));
+    CheckResult(Shape()->put_DACRangeY(CreateRange(GetAlignmentY().range)));
 }
 
 // Common properties first, then the polygon's own, its vertices appended after any the target holds, through

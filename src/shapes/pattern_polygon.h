@@ -7,6 +7,7 @@
 
 #include "core/pattern_impl.h"
 #include "platform/error_info.h"
+#include "shapes/excludable_pattern_impl.h"
 #include "shapes/polygon_generator.h"
 
 #include <beamweaver/exclusion.h>
@@ -14,8 +15,7 @@
 
 namespace Norvane::Lumis::Scanning {
 
-class CPatternPolygon : public IPatternShapeImpl<IPatternPolygon>,
-                        public IExcludablePatternShape,
+class CPatternPolygon : public ExcludablePatternImpl<IPatternPolygon, IShapePolygon>,
                         public ICloneablePattern,
                         public ISupportErrorInfoImplEx<IPatternPolygon, IPattern> {
   public:
@@ -49,19 +49,12 @@ class CPatternPolygon : public IPatternShapeImpl<IPatternPolygon>,
     // IPatternShape
     HRESULT Accept(IPatternShapeVisitor* visitor) override;
 
-    // IExcludablePatternShape
-    HRESULT get_IsExclusion(VARIANT_BOOL* value) override;
-    HRESULT put_IsExclusion(VARIANT_BOOL value) override;
-    HRESULT get_Shape(IShape** value) override;
-
     // ICloneablePattern
     HRESULT Clone(IPattern** clone) override;
     HRESULT CopyTo(IPattern* target) override;
 
   protected:
     CComPtr<IScanDefinition> RenderPattern() override;
-    void OnExclusionZoneSet(IExclusionZone* zone) override;
-    void OnExclusionZoneCleared() override;
     void OnRenderingSettingsChanged(const PatternRenderingSettings& settings) override;
 
   private:
@@ -74,14 +67,9 @@ class CPatternPolygon : public IPatternShapeImpl<IPatternPolygon>,
     std::uint8_t PointFlags() const;
     // Sets the shape's TransformationMatrix, DACRangeX and DACRangeY from the pattern.
     void UpdateExclusionShape();
-    // Puts the shape into the stored zone unless it is there already, or takes it out.
-    void UpdateZoneMembership();
-    IShape* ExclusionShape() const;
     void CopyPolygonPropertiesTo(IPatternPolygon* target);
 
     PolygonGeometry polygon_;
-    bool isExclusion_ = false;
-    CComPtr<IShapePolygon> shape_;
 };
 
 } // namespace Norvane::Lumis::Scanning

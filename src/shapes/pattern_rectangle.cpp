@@ -26,8 +26,8 @@ std::u16string ToDescription(const std::string& text) {
 } // namespace
 
 CPatternRectangle::CPatternRectangle()
-    : IPatternShapeImpl<IPatternRectangle>(CLSID_PatternRectangle),
-      shape_(CreateInstance<IShapeRectangle>(CLSID_ShapeRectangle)) {
+    : ExcludablePatternImpl<IPatternRectangle, IShapeRectangle>(CLSID_PatternRectangle,
+                                                                CLSID_ShapeRectangle) {
     UpdateResolutionForDwellTimes();
     UpdateExclusionShape();
 }
@@ -140,27 +140,6 @@ HRESULT CPatternRectangle::Accept(IPatternShapeVisitor* visitor) {
     });
 }
 
-HRESULT CPatternRectangle::get_IsExclusion(VARIANT_BOOL* value) {
-    return Guarded(IID_IExcludablePatternShape, Mutex(), value,
-                   [&] { *value = ToVariantBool(isExclusion_); });
-}
-
-HRESULT CPatternRectangle::put_IsExclusion(VARIANT_BOOL value) {
-    return Guarded(IID_IExcludablePatternShape, Mutex(), [&] {
-        isExclusion_ = value != 0;
-        UpdateZoneMembership();
-    });
-}
-
-// The shape is made with the object and never replaced, so handing it out takes no lock; a zone that
-// asks a pattern for its shape while holding its own lock cannot wait on this one.
-HRESULT CPatternRectangle::get_Shape(IShape** value) {
-    return Guarded(IID_IExcludablePatternShape, value, [&] {
-        *value = ExclusionShape();
-        (*value)->AddRef();
-    });
-}
-
 HRESULT CPatternRectangle::Clone(IPattern** clone) {
     return Guarded(IID_ICloneablePattern, Mutex(), clone, [&] {
         CComPtr<ICloneablePattern> created = CreateInstance<ICloneablePattern>(CLSID_PatternRectangle);
@@ -193,18 +172,6 @@ CComPtr<IScanDefinition> CPatternRectangle::RenderPattern() {
     WriteRectanglePoints(PointBufferView(list).Points(), rectangle_, *this, PointFlags());
     TransformPointList({0.0, 0.0}, list);
     return PackageShapeRendering(list, RectangleMeanDwellTime(rectangle_));
-}
-
-void CPatternRectangle::OnExclusionZoneSet(IExclusionZone* zone) {
-    boost::unique_lock<ObjectMutex> lock(Mutex());
-    if (zone != nullptr && isExclusion_)
-        CheckResult(zone->AddShape(ExclusionShape()));
-}
-
-void CPatternRectangle::OnExclusionZoneCleared() {
-    boost::unique_lock<ObjectMutex> lock(Mutex());
-    if (CComPtr<IExclusionZone> zone = StoredExclusionZone())
-        CheckResult(zone->RemoveShape(ExclusionShape()));
 }
 
 void CPatternRectangle::OnRenderingSettingsChanged(const PatternRenderingSettings&) {
@@ -244,34 +211,16 @@ double CPatternRectangle::EffectiveLoopTime() {
 }
 
 std::uint8_t CPatternRectangle::PointFlags() const {
-    return isExclusion_ ? PointFlag_Blank : PointFlag_Acquire;
+    return IsExclusion() ? PointFlag_Blank : PointFlag_Acquire;
 }
 
 void CPatternRectangle::UpdateExclusionShape() {
-    if (!shape_)
+    if (!Shape())
         return;
-    CheckResult(shape_->put_Rectangle(CreateRectangleFloat(rectangle_.rectangle)));
-    CheckResult(shape_->put_TransformationMatrix(CreateMatrix(GetTransformationMatrix())));
-    CheckResult(shape_->put_DACRangeX(CreateRange(GetAlignmentX().range)));
-    CheckResult(shape_->put_DACRangeY(CreateRange(GetAlignmentY().range)));
-}
-
-void CPatternRectangle::UpdateZoneMembership() {
-    CComPtr<IExclusionZone> zone = StoredExclusionZone();
-    if (!zone)
-        return;
-    if (!isExclusion_) {
-        CheckResult(zone->RemoveShape(ExclusionShape()));
-        return;
-    }
-    VARIANT_BOOL contained = VARIANT_FALSE;
-    CheckResult(zone->ContainsShape(ExclusionShape(), &contained));
-    if (contained == VARIANT_FALSE)
-        CheckResult(zone->AddShape(ExclusionShape()));
-}
-
-IShape* CPatternRectangle::ExclusionShape() const {
-    return shape_.Get();
+    CheckResult(Shape()->put_Rectangle(CreateRectangleFloat(rectangle_.rectangle)));
+    CheckResult(Shape()->put_TransformationMatrix(CreateMatrix(GetTransformationMatrix())));
+    CheckResult(Shape()->put_DACRangeX(CreateRange(GetAlignmentX().range)));
+    CheckResult(Shape()->put_DACRangeY(CreateRange(GetAlignmentY().range)));
 }
 
 // Common properties first, then the rectangle's own through the target's setters; the first failing

@@ -7,6 +7,7 @@
 
 #include "core/pattern_impl.h"
 #include "platform/error_info.h"
+#include "shapes/excludable_pattern_impl.h"
 #include "shapes/rectangle_generator.h"
 
 #include <beamweaver/exclusion.h>
@@ -14,8 +15,7 @@
 
 namespace Norvane::Lumis::Scanning {
 
-class CPatternRectangle : public IPatternShapeImpl<IPatternRectangle>,
-                          public IExcludablePatternShape,
+class CPatternRectangle : public ExcludablePatternImpl<IPatternRectangle, IShapeRectangle>,
                           public ICloneablePattern,
                           public ISupportErrorInfoImplEx<IPatternRectangle, IPattern> {
   public:
@@ -49,19 +49,12 @@ class CPatternRectangle : public IPatternShapeImpl<IPatternRectangle>,
     // IPatternShape
     HRESULT Accept(IPatternShapeVisitor* visitor) override;
 
-    // IExcludablePatternShape
-    HRESULT get_IsExclusion(VARIANT_BOOL* value) override;
-    HRESULT put_IsExclusion(VARIANT_BOOL value) override;
-    HRESULT get_Shape(IShape** value) override;
-
     // ICloneablePattern
     HRESULT Clone(IPattern** clone) override;
     HRESULT CopyTo(IPattern* target) override;
 
   protected:
     CComPtr<IScanDefinition> RenderPattern() override;
-    void OnExclusionZoneSet(IExclusionZone* zone) override;
-    void OnExclusionZoneCleared() override;
     void OnRenderingSettingsChanged(const PatternRenderingSettings& settings) override;
 
   private:
@@ -74,14 +67,9 @@ class CPatternRectangle : public IPatternShapeImpl<IPatternRectangle>,
     std::uint8_t PointFlags() const;
     // Sets the shape's Rectangle, TransformationMatrix, DACRangeX and DACRangeY from the pattern.
     void UpdateExclusionShape();
-    // Puts the shape into the stored zone unless it is there already, or takes it out.
-    void UpdateZoneMembership();
-    IShape* ExclusionShape() const;
     void CopyRectanglePropertiesTo(IPatternRectangle* target);
 
     RectangleGeometry rectangle_;
-    bool isExclusion_ = false;
-    CComPtr<IShapeRectangle> shape_;
 };
 
 } // namespace Norvane::Lumis::Scanning
