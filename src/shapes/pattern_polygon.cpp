@@ -14,18 +14,13 @@ namespace Norvane::Lumis::Scanning {
 
 namespace {
 
-bool IsPitch(double value) {
-    return value > 0.0 && value < 1.0;
-}
-
 std::u16string ToDescription(const std::string& text) {
     return {text.begin(), text.end()};
 }
 
 } // namespace
 
-CPatternPolygon::CPatternPolygon()
-    : ExcludablePatternImpl<IPatternPolygon, IShapePolygon>(CLSID_PatternPolygon, CLSID_ShapePolygon) {
+CPatternPolygon::CPatternPolygon() : RectangularFillPatternImpl(CLSID_PatternPolygon, CLSID_ShapePolygon) {
     UpdateResolutionForDwellTimes();
     UpdateExclusionShape();
 }
@@ -35,62 +30,17 @@ HRESULT CPatternPolygon::AddPoint(ICoordinateFloat* point) {
     return Guarded(IID_IPatternPolygon, Mutex(), [&] {
         const coordinate<double> vertex = ReadRelativeCoordinate(point, "Point");
         CheckResult(Shape()->AddPoint(CreateCoordinate(vertex)));
-        polygon_.vertices.push_back(vertex);
+        geometry_.vertices.push_back(vertex);
     });
 }
 
 HRESULT CPatternPolygon::ModifyPoint(std::int32_t index, ICoordinateFloat* point) {
     return Guarded(IID_IPatternPolygon, Mutex(), [&] {
         const coordinate<double> vertex = ReadRelativeCoordinate(point, "Point");
-        if (index < 0 || static_cast<std::size_t>(index) >= polygon_.vertices.size())
+        if (index < 0 || static_cast<std::size_t>(index) >= geometry_.vertices.size())
             throw std::invalid_argument("Index out of range");
         CheckResult(Shape()->ModifyPoint(index, CreateCoordinate(vertex)));
-        polygon_.vertices[static_cast<std::size_t>(index)] = vertex;
-    });
-}
-
-HRESULT CPatternPolygon::get_BeginDwellTime(double* value) {
-    return Guarded(IID_IPatternPolygon, Mutex(), value, [&] { *value = polygon_.beginDwellTime; });
-}
-
-HRESULT CPatternPolygon::put_BeginDwellTime(double value) {
-    return PutDwellTime(value, &PolygonGeometry::beginDwellTime);
-}
-
-HRESULT CPatternPolygon::get_EndDwellTime(double* value) {
-    return Guarded(IID_IPatternPolygon, Mutex(), value, [&] { *value = polygon_.endDwellTime; });
-}
-
-HRESULT CPatternPolygon::put_EndDwellTime(double value) {
-    return PutDwellTime(value, &PolygonGeometry::endDwellTime);
-}
-
-HRESULT CPatternPolygon::get_ScanStrategy(IScanStrategyRectangular** value) {
-    return Guarded(IID_IPatternPolygon, Mutex(), value,
-                   [&] { *value = MakeScanStrategyRectangular(polygon_.strategy).Detach(); });
-}
-
-// Pitches must lie strictly within the field; the enumerations are kept as given and checked when
-// rendering.
-HRESULT CPatternPolygon::put_ScanStrategy(IScanStrategyRectangular* value) {
-    return Guarded(IID_IPatternPolygon, Mutex(), [&] {
-        const RectangularStrategy strategy = ReadScanStrategyRectangular(value);
-        if (!(IsPitch(strategy.pitchX) && IsPitch(strategy.pitchY)))
-            return E_INVALIDARG;
-        polygon_.strategy = strategy;
-        return S_OK;
-    });
-}
-
-HRESULT CPatternPolygon::get_TransformationMatrix(ITransformationMatrix2D** value) {
-    return Guarded(IID_IPatternPolygon, Mutex(), value,
-                   [&] { *value = CreateMatrix(GetTransformationMatrix()).Detach(); });
-}
-
-HRESULT CPatternPolygon::put_TransformationMatrix(ITransformationMatrix2D* value) {
-    return Guarded(IID_IPatternPolygon, Mutex(), [&] {
-        SetTransformationMatrix(ReadMatrixProperty(value, "TransformationMatrix"));
-        UpdateExclusionShape();
+        geometry_.vertices[static_cast<std::size_t>(index)] = vertex;
     });
 }
 
@@ -106,24 +56,14 @@ HRESULT CPatternPolygon::Validate(IPatternValidationResult** result) {
 HRESULT CPatternPolygon::GetLoopTime(double* loopTime) {
     return Guarded(IID_IPatternPolygon, Mutex(), loopTime, [&] {
         const double pass = GetPreBlankingTotalTime() + EffectiveLoopTime() + GetPostBlankingTime();
-        *loopTime = PolygonPassCount(polygon_.strategy) * pass;
+        *loopTime = PolygonPassCount(geometry_.strategy) * pass;
     });
-}
-
-HRESULT CPatternPolygon::GetMinDwellTime(double* dwellTime) {
-    return Guarded(IID_IPatternPolygon, Mutex(), dwellTime,
-                   [&] { *dwellTime = std::min(polygon_.beginDwellTime, polygon_.endDwellTime); });
-}
-
-HRESULT CPatternPolygon::GetMaxDwellTime(double* dwellTime) {
-    return Guarded(IID_IPatternPolygon, Mutex(), dwellTime,
-                   [&] { *dwellTime = std::max(polygon_.beginDwellTime, polygon_.endDwellTime); });
 }
 
 // The vertices' box, its two corners mapped by the matrix about the origin and put in order.
 HRESULT CPatternPolygon::GetDacBoundingBox(IRectangleInt** boundingBox) {
     return Guarded(IID_IPatternPolygon, Mutex(), boundingBox, [&] {
-        const RectangleFloat box = GetPointsBoundingBox(polygon_.vertices);
+        const RectangleFloat box = GetPointsBoundingBox(geometry_.vertices);
         *boundingBox =
             CreateRectangleInt(TransformedDacBox({box.left, box.top}, {box.right, box.bottom})).Detach();
     });
@@ -164,39 +104,25 @@ CComPtr<IScanDefinition> CPatternPolygon::RenderPattern() {
     boost::unique_lock<ObjectMutex> lock(Mutex());
     ValidateOrThrow();
     CComPtr<IPatternPointList> list =
-        CreatePointList(static_cast<std::uint32_t>(PolygonListPointCount(polygon_, *this)));
-    WritePolygonPoints(PointBufferView(list).Points(), polygon_, *this, PointFlags());
+        CreatePointList(static_cast<std::uint32_t>(PolygonListPointCount(geometry_, *this)));
+    WritePolygonPoints(PointBufferView(list).Points(), geometry_, *this, PointFlags());
     TransformPointList({0.0, 0.0}, list);
-    return PackageShapeRendering(list, PolygonMeanDwellTime(polygon_));
+    return PackageShapeRendering(list, PolygonMeanDwellTime(geometry_));
 }
 
 void CPatternPolygon::OnRenderingSettingsChanged(const PatternRenderingSettings&) {
     UpdateExclusionShape();
 }
 
-HRESULT CPatternPolygon::PutDwellTime(double value, double PolygonGeometry::*field) {
-    return Guarded(IID_IPatternPolygon, Mutex(), [&] {
-        if (!(value > 0.0 && std::isfinite(value)))
-            return E_INVALIDARG;
-        polygon_.*field = value;
-        UpdateResolutionForDwellTimes();
-        return S_OK;
-    });
-}
-
-void CPatternPolygon::UpdateResolutionForDwellTimes() {
-    UpdateDwellTimeResolution(std::max(polygon_.beginDwellTime, polygon_.endDwellTime));
-}
-
 CComPtr<IPatternValidationResult> CPatternPolygon::MakeValidation() {
     UpdateResolutionForDwellTimes();
-    const std::string description = PolygonValidationProblems(polygon_, *this);
+    const std::string description = PolygonValidationProblems(geometry_, *this);
     return MakeValidationResult(description.empty(), ToDescription(description));
 }
 
 double CPatternPolygon::EffectiveLoopTime() {
     ValidateOrThrow();
-    return PolygonEffectiveLoopTime(polygon_, *this);
+    return PolygonEffectiveLoopTime(geometry_, *this);
 }
 
 std::uint8_t CPatternPolygon::PointFlags() const {
@@ -216,11 +142,11 @@ void CPatternPolygon::UpdateExclusionShape() {
 // stays copied.
 void CPatternPolygon::CopyPolygonPropertiesTo(IPatternPolygon* target) {
     CopyCommonPatternProperties(this, target);
-    CheckResult(target->put_BeginDwellTime(polygon_.beginDwellTime));
-    CheckResult(target->put_EndDwellTime(polygon_.endDwellTime));
-    CheckResult(target->put_ScanStrategy(MakeScanStrategyRectangular(polygon_.strategy)));
+    CheckResult(target->put_BeginDwellTime(geometry_.beginDwellTime));
+    CheckResult(target->put_EndDwellTime(geometry_.endDwellTime));
+    CheckResult(target->put_ScanStrategy(MakeScanStrategyRectangular(geometry_.strategy)));
     CheckResult(target->put_TransformationMatrix(CreateMatrix(GetTransformationMatrix())));
-    for (const coordinate<double>& vertex : polygon_.vertices)
+    for (const coordinate<double>& vertex : geometry_.vertices)
         CheckResult(target->AddPoint(CreateCoordinate(vertex)));
 }
 

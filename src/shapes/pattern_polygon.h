@@ -7,15 +7,15 @@
 
 #include "core/pattern_impl.h"
 #include "platform/error_info.h"
-#include "shapes/excludable_pattern_impl.h"
 #include "shapes/polygon_generator.h"
+#include "shapes/rectangular_fill_pattern_impl.h"
 
 #include <beamweaver/exclusion.h>
 #include <beamweaver/polygon.h>
 
 namespace Norvane::Lumis::Scanning {
 
-class CPatternPolygon : public ExcludablePatternImpl<IPatternPolygon, IShapePolygon>,
+class CPatternPolygon : public RectangularFillPatternImpl<IPatternPolygon, IShapePolygon, PolygonGeometry>,
                         public ICloneablePattern,
                         public ISupportErrorInfoImplEx<IPatternPolygon, IPattern> {
   public:
@@ -29,21 +29,11 @@ class CPatternPolygon : public ExcludablePatternImpl<IPatternPolygon, IShapePoly
     // IPatternPolygon
     HRESULT AddPoint(ICoordinateFloat* point) override;
     HRESULT ModifyPoint(std::int32_t index, ICoordinateFloat* point) override;
-    HRESULT get_BeginDwellTime(double* value) override;
-    HRESULT put_BeginDwellTime(double value) override;
-    HRESULT get_EndDwellTime(double* value) override;
-    HRESULT put_EndDwellTime(double value) override;
-    HRESULT get_ScanStrategy(IScanStrategyRectangular** value) override;
-    HRESULT put_ScanStrategy(IScanStrategyRectangular* value) override;
-    HRESULT get_TransformationMatrix(ITransformationMatrix2D** value) override;
-    HRESULT put_TransformationMatrix(ITransformationMatrix2D* value) override;
     HRESULT GetEffectiveLoopTime(double* loopTime) override;
 
     // IPattern
     HRESULT Validate(IPatternValidationResult** result) override;
     HRESULT GetLoopTime(double* loopTime) override;
-    HRESULT GetMinDwellTime(double* dwellTime) override;
-    HRESULT GetMaxDwellTime(double* dwellTime) override;
     HRESULT GetDacBoundingBox(IRectangleInt** boundingBox) override;
 
     // IPatternShape
@@ -54,22 +44,16 @@ class CPatternPolygon : public ExcludablePatternImpl<IPatternPolygon, IShapePoly
     HRESULT CopyTo(IPattern* target) override;
 
   protected:
+    // Sets the shape's geometry, TransformationMatrix, DACRangeX and DACRangeY from the pattern.
+    void UpdateExclusionShape() override;
     CComPtr<IScanDefinition> RenderPattern() override;
     void OnRenderingSettingsChanged(const PatternRenderingSettings& settings) override;
 
   private:
-    // Stores a dwell time in field and recomputes the resolution; refuses what is not a positive, finite
-    // time.
-    HRESULT PutDwellTime(double value, double PolygonGeometry::*field);
-    void UpdateResolutionForDwellTimes();
     CComPtr<IPatternValidationResult> MakeValidation();
     double EffectiveLoopTime();
     std::uint8_t PointFlags() const;
-    // Sets the shape's TransformationMatrix, DACRangeX and DACRangeY from the pattern.
-    void UpdateExclusionShape();
     void CopyPolygonPropertiesTo(IPatternPolygon* target);
-
-    PolygonGeometry polygon_;
 };
 
 } // namespace Norvane::Lumis::Scanning

@@ -15,10 +15,6 @@ namespace Norvane::Lumis::Scanning {
 
 namespace {
 
-bool IsPitch(double value) {
-    return value > 0.0 && value < 1.0;
-}
-
 std::u16string ToDescription(const std::string& text) {
     return {text.begin(), text.end()};
 }
@@ -26,65 +22,19 @@ std::u16string ToDescription(const std::string& text) {
 } // namespace
 
 CPatternRectangle::CPatternRectangle()
-    : ExcludablePatternImpl<IPatternRectangle, IShapeRectangle>(CLSID_PatternRectangle,
-                                                                CLSID_ShapeRectangle) {
+    : RectangularFillPatternImpl(CLSID_PatternRectangle, CLSID_ShapeRectangle) {
     UpdateResolutionForDwellTimes();
     UpdateExclusionShape();
 }
 
 HRESULT CPatternRectangle::get_Rectangle(IRectangleFloat** value) {
     return Guarded(IID_IPatternRectangle, Mutex(), value,
-                   [&] { *value = CreateRectangleFloat(rectangle_.rectangle).Detach(); });
+                   [&] { *value = CreateRectangleFloat(geometry_.rectangle).Detach(); });
 }
 
 HRESULT CPatternRectangle::put_Rectangle(IRectangleFloat* value) {
     return Guarded(IID_IPatternRectangle, Mutex(), [&] {
-        rectangle_.rectangle = ReadRelativeRectangle(value);
-        UpdateExclusionShape();
-    });
-}
-
-HRESULT CPatternRectangle::get_BeginDwellTime(double* value) {
-    return Guarded(IID_IPatternRectangle, Mutex(), value, [&] { *value = rectangle_.beginDwellTime; });
-}
-
-HRESULT CPatternRectangle::put_BeginDwellTime(double value) {
-    return PutDwellTime(value, &RectangleGeometry::beginDwellTime);
-}
-
-HRESULT CPatternRectangle::get_EndDwellTime(double* value) {
-    return Guarded(IID_IPatternRectangle, Mutex(), value, [&] { *value = rectangle_.endDwellTime; });
-}
-
-HRESULT CPatternRectangle::put_EndDwellTime(double value) {
-    return PutDwellTime(value, &RectangleGeometry::endDwellTime);
-}
-
-HRESULT CPatternRectangle::get_ScanStrategy(IScanStrategyRectangular** value) {
-    return Guarded(IID_IPatternRectangle, Mutex(), value,
-                   [&] { *value = MakeScanStrategyRectangular(rectangle_.strategy).Detach(); });
-}
-
-// Pitches must lie strictly within the field; the enumerations are kept as given and read leniently when
-// rendering.
-HRESULT CPatternRectangle::put_ScanStrategy(IScanStrategyRectangular* value) {
-    return Guarded(IID_IPatternRectangle, Mutex(), [&] {
-        const RectangularStrategy strategy = ReadScanStrategyRectangular(value);
-        if (!(IsPitch(strategy.pitchX) && IsPitch(strategy.pitchY)))
-            return E_INVALIDARG;
-        rectangle_.strategy = strategy;
-        return S_OK;
-    });
-}
-
-HRESULT CPatternRectangle::get_TransformationMatrix(ITransformationMatrix2D** value) {
-    return Guarded(IID_IPatternRectangle, Mutex(), value,
-                   [&] { *value = CreateMatrix(GetTransformationMatrix()).Detach(); });
-}
-
-HRESULT CPatternRectangle::put_TransformationMatrix(ITransformationMatrix2D* value) {
-    return Guarded(IID_IPatternRectangle, Mutex(), [&] {
-        SetTransformationMatrix(ReadMatrixProperty(value, "TransformationMatrix"));
+        geometry_.rectangle = ReadRelativeRectangle(value);
         UpdateExclusionShape();
     });
 }
@@ -101,24 +51,14 @@ HRESULT CPatternRectangle::Validate(IPatternValidationResult** result) {
 HRESULT CPatternRectangle::GetLoopTime(double* loopTime) {
     return Guarded(IID_IPatternRectangle, Mutex(), loopTime, [&] {
         const double pass = GetPreBlankingTotalTime() + EffectiveLoopTime() + GetPostBlankingTime();
-        *loopTime = RectanglePassCount(rectangle_.strategy) * pass;
+        *loopTime = RectanglePassCount(geometry_.strategy) * pass;
     });
-}
-
-HRESULT CPatternRectangle::GetMinDwellTime(double* dwellTime) {
-    return Guarded(IID_IPatternRectangle, Mutex(), dwellTime,
-                   [&] { *dwellTime = std::min(rectangle_.beginDwellTime, rectangle_.endDwellTime); });
-}
-
-HRESULT CPatternRectangle::GetMaxDwellTime(double* dwellTime) {
-    return Guarded(IID_IPatternRectangle, Mutex(), dwellTime,
-                   [&] { *dwellTime = std::max(rectangle_.beginDwellTime, rectangle_.endDwellTime); });
 }
 
 // The box of all four corners after the matrix, so that a rotated rectangle stays inside it.
 HRESULT CPatternRectangle::GetDacBoundingBox(IRectangleInt** boundingBox) {
     return Guarded(IID_IPatternRectangle, Mutex(), boundingBox, [&] {
-        const RectangleFloat& area = rectangle_.rectangle;
+        const RectangleFloat& area = geometry_.rectangle;
         const TransformationMatrix& m = GetTransformationMatrix();
         const auto map = [&](double x, double y) {
             return coordinate<double>{m.m0 * x + m.m1 * y + m.m2, m.m3 * x + m.m4 * y + m.m5};
@@ -168,28 +108,14 @@ CComPtr<IScanDefinition> CPatternRectangle::RenderPattern() {
     boost::unique_lock<ObjectMutex> lock(Mutex());
     ValidateOrThrow();
     CComPtr<IPatternPointList> list =
-        CreatePointList(static_cast<std::uint32_t>(RectangleListPointCount(rectangle_, *this)));
-    WriteRectanglePoints(PointBufferView(list).Points(), rectangle_, *this, PointFlags());
+        CreatePointList(static_cast<std::uint32_t>(RectangleListPointCount(geometry_, *this)));
+    WriteRectanglePoints(PointBufferView(list).Points(), geometry_, *this, PointFlags());
     TransformPointList({0.0, 0.0}, list);
-    return PackageShapeRendering(list, RectangleMeanDwellTime(rectangle_));
+    return PackageShapeRendering(list, RectangleMeanDwellTime(geometry_));
 }
 
 void CPatternRectangle::OnRenderingSettingsChanged(const PatternRenderingSettings&) {
     UpdateExclusionShape();
-}
-
-HRESULT CPatternRectangle::PutDwellTime(double value, double RectangleGeometry::*field) {
-    return Guarded(IID_IPatternRectangle, Mutex(), [&] {
-        if (!(value > 0.0 && std::isfinite(value)))
-            return E_INVALIDARG;
-        rectangle_.*field = value;
-        UpdateResolutionForDwellTimes();
-        return S_OK;
-    });
-}
-
-void CPatternRectangle::UpdateResolutionForDwellTimes() {
-    UpdateDwellTimeResolution(std::max(rectangle_.beginDwellTime, rectangle_.endDwellTime));
 }
 
 // Dwell times finer than the resolution first, then pitches that give no grid.
@@ -197,17 +123,17 @@ CComPtr<IPatternValidationResult> CPatternRectangle::MakeValidation() {
     UpdateResolutionForDwellTimes();
     const double resolution = CPattern::GetDwellTimeResolution();
     std::string description;
-    if (resolution > rectangle_.beginDwellTime)
+    if (resolution > geometry_.beginDwellTime)
         description += "BeginDwellTime out of range. ";
-    if (resolution > rectangle_.endDwellTime)
+    if (resolution > geometry_.endDwellTime)
         description += "EndDwellTime out of range. ";
-    description += RectangleGridProblems(rectangle_, *this);
+    description += RectangleGridProblems(geometry_, *this);
     return MakeValidationResult(description.empty(), ToDescription(description));
 }
 
 double CPatternRectangle::EffectiveLoopTime() {
     ValidateOrThrow();
-    return RectangleEffectiveLoopTime(rectangle_, *this);
+    return RectangleEffectiveLoopTime(geometry_, *this);
 }
 
 std::uint8_t CPatternRectangle::PointFlags() const {
@@ -217,7 +143,7 @@ std::uint8_t CPatternRectangle::PointFlags() const {
 void CPatternRectangle::UpdateExclusionShape() {
     if (!Shape())
         return;
-    CheckResult(Shape()->put_Rectangle(CreateRectangleFloat(rectangle_.rectangle)));
+    CheckResult(Shape()->put_Rectangle(CreateRectangleFloat(geometry_.rectangle)));
     CheckResult(Shape()->put_TransformationMatrix(CreateMatrix(GetTransformationMatrix())));
     CheckResult(Shape()->put_DACRangeX(CreateRange(GetAlignmentX().range)));
     CheckResult(Shape()->put_DACRangeY(CreateRange(GetAlignmentY().range)));
@@ -227,10 +153,10 @@ void CPatternRectangle::UpdateExclusionShape() {
 // setter ends the copy with its error, and what was copied before stays copied.
 void CPatternRectangle::CopyRectanglePropertiesTo(IPatternRectangle* target) {
     CopyCommonPatternProperties(this, target);
-    CheckResult(target->put_Rectangle(CreateRectangleFloat(rectangle_.rectangle)));
-    CheckResult(target->put_BeginDwellTime(rectangle_.beginDwellTime));
-    CheckResult(target->put_EndDwellTime(rectangle_.endDwellTime));
-    CheckResult(target->put_ScanStrategy(MakeScanStrategyRectangular(rectangle_.strategy)));
+    CheckResult(target->put_Rectangle(CreateRectangleFloat(geometry_.rectangle)));
+    CheckResult(target->put_BeginDwellTime(geometry_.beginDwellTime));
+    CheckResult(target->put_EndDwellTime(geometry_.endDwellTime));
+    CheckResult(target->put_ScanStrategy(MakeScanStrategyRectangular(geometry_.strategy)));
     CheckResult(target->put_TransformationMatrix(CreateMatrix(GetTransformationMatrix())));
 }
 

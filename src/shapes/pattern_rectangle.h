@@ -7,17 +7,18 @@
 
 #include "core/pattern_impl.h"
 #include "platform/error_info.h"
-#include "shapes/excludable_pattern_impl.h"
 #include "shapes/rectangle_generator.h"
+#include "shapes/rectangular_fill_pattern_impl.h"
 
 #include <beamweaver/exclusion.h>
 #include <beamweaver/shapes.h>
 
 namespace Norvane::Lumis::Scanning {
 
-class CPatternRectangle : public ExcludablePatternImpl<IPatternRectangle, IShapeRectangle>,
-                          public ICloneablePattern,
-                          public ISupportErrorInfoImplEx<IPatternRectangle, IPattern> {
+class CPatternRectangle
+    : public RectangularFillPatternImpl<IPatternRectangle, IShapeRectangle, RectangleGeometry>,
+      public ICloneablePattern,
+      public ISupportErrorInfoImplEx<IPatternRectangle, IPattern> {
   public:
     using Interfaces = InterfaceMap<IPatternRectangle, IExclusionAwarePattern, IExcludablePatternShape,
                                     ICloneablePattern, ISupportErrorInfo>;
@@ -29,21 +30,11 @@ class CPatternRectangle : public ExcludablePatternImpl<IPatternRectangle, IShape
     // IPatternRectangle
     HRESULT get_Rectangle(IRectangleFloat** value) override;
     HRESULT put_Rectangle(IRectangleFloat* value) override;
-    HRESULT get_BeginDwellTime(double* value) override;
-    HRESULT put_BeginDwellTime(double value) override;
-    HRESULT get_EndDwellTime(double* value) override;
-    HRESULT put_EndDwellTime(double value) override;
-    HRESULT get_ScanStrategy(IScanStrategyRectangular** value) override;
-    HRESULT put_ScanStrategy(IScanStrategyRectangular* value) override;
-    HRESULT get_TransformationMatrix(ITransformationMatrix2D** value) override;
-    HRESULT put_TransformationMatrix(ITransformationMatrix2D* value) override;
     HRESULT GetEffectiveLoopTime(double* loopTime) override;
 
     // IPattern
     HRESULT Validate(IPatternValidationResult** result) override;
     HRESULT GetLoopTime(double* loopTime) override;
-    HRESULT GetMinDwellTime(double* dwellTime) override;
-    HRESULT GetMaxDwellTime(double* dwellTime) override;
     HRESULT GetDacBoundingBox(IRectangleInt** boundingBox) override;
 
     // IPatternShape
@@ -54,22 +45,16 @@ class CPatternRectangle : public ExcludablePatternImpl<IPatternRectangle, IShape
     HRESULT CopyTo(IPattern* target) override;
 
   protected:
+    // Sets the shape's geometry, TransformationMatrix, DACRangeX and DACRangeY from the pattern.
+    void UpdateExclusionShape() override;
     CComPtr<IScanDefinition> RenderPattern() override;
     void OnRenderingSettingsChanged(const PatternRenderingSettings& settings) override;
 
   private:
-    // Stores a dwell time in field and recomputes the resolution; refuses what is not a positive, finite
-    // time.
-    HRESULT PutDwellTime(double value, double RectangleGeometry::*field);
-    void UpdateResolutionForDwellTimes();
     CComPtr<IPatternValidationResult> MakeValidation();
     double EffectiveLoopTime();
     std::uint8_t PointFlags() const;
-    // Sets the shape's Rectangle, TransformationMatrix, DACRangeX and DACRangeY from the pattern.
-    void UpdateExclusionShape();
     void CopyRectanglePropertiesTo(IPatternRectangle* target);
-
-    RectangleGeometry rectangle_;
 };
 
 } // namespace Norvane::Lumis::Scanning
